@@ -1,0 +1,53 @@
+# SPDX-License-Identifier: MIT
+# Tools, Qt version and compiler settings shared by every folder.
+
+set(HMI_PLATFORM reference CACHE STRING "Platform libraries: 'reference' (this tree) or 'system' (find_package(HmiPlatform))")
+set_property(CACHE HMI_PLATFORM PROPERTY STRINGS reference system)
+if(NOT HMI_PLATFORM MATCHES "^(reference|system)$")
+    message(FATAL_ERROR "HMI_PLATFORM is '${HMI_PLATFORM}'; it must be 'reference' or 'system'")
+endif()
+set(HMI_QT 5 CACHE STRING "Major version of Qt: 5 or 6")
+set_property(CACHE HMI_QT PROPERTY STRINGS 5 6)
+option(HMI_BENCHMARKS "Build the benchmarks" OFF)
+option(HMI_QML_PRIVATE "Let the QML loggers use Qt's private object model (fast); otherwise the public API" ON)
+
+find_package(ECM 5.100 REQUIRED NO_MODULE)
+list(APPEND CMAKE_MODULE_PATH ${ECM_MODULE_PATH})
+include(GNUInstallDirs)
+include(CMakePackageConfigHelpers)
+include(GenerateExportHeader)
+include(ECMEnableSanitizers)
+include(ECMGenerateHeaders)
+include(ECMAddTests)
+include(FeatureSummary)
+include(CTest)
+
+find_package(QT NAMES Qt${HMI_QT} REQUIRED COMPONENTS Core)
+find_package(Qt${QT_VERSION_MAJOR} 5.15 REQUIRED COMPONENTS Core Gui Qml Quick)
+
+set(CMAKE_CXX_STANDARD 17)
+set(CMAKE_CXX_STANDARD_REQUIRED ON)
+set(CMAKE_CXX_EXTENSIONS OFF)
+set(CMAKE_CXX_VISIBILITY_PRESET hidden)
+set(CMAKE_VISIBILITY_INLINES_HIDDEN ON)
+set(CMAKE_POSITION_INDEPENDENT_CODE ON)
+set(CMAKE_AUTOMOC ON)
+set(CMAKE_INCLUDE_CURRENT_DIR OFF)
+set(CMAKE_INSTALL_RPATH "$ORIGIN/../${CMAKE_INSTALL_LIBDIR}")
+set(CMAKE_EXPORT_COMPILE_COMMANDS ON)
+
+find_program(CCACHE_PROGRAM ccache)
+if(CCACHE_PROGRAM AND NOT CMAKE_CXX_COMPILER_LAUNCHER)
+    set(CMAKE_CXX_COMPILER_LAUNCHER ${CCACHE_PROGRAM})
+endif()
+
+add_compile_definitions(
+    QT_NO_CAST_FROM_ASCII QT_NO_CAST_TO_ASCII QT_NO_CAST_FROM_BYTEARRAY QT_NO_URL_CAST_FROM_STRING
+    QT_NO_KEYWORDS QT_NO_FOREACH QT_NO_NARROWING_CONVERSIONS_IN_CONNECT QT_STRICT_ITERATORS
+    QT_MESSAGELOGCONTEXT)
+add_compile_options(-Wall -Wextra -Wpedantic -Wshadow=local -Wnon-virtual-dtor -Woverloaded-virtual -Wcast-qual
+    -Wformat-security -Wundef)
+add_link_options(-Wl,--as-needed)
+if(NOT ECM_ENABLE_SANITIZERS) # sanitized libraries find the runtime in the executable
+    add_link_options(-Wl,--no-undefined)
+endif()

@@ -1,0 +1,79 @@
+# SPDX-License-Identifier: MIT
+# The few functions with which every folder declares its targets.
+
+set(HMI_BASE_DIR ${CMAKE_BINARY_DIR}/headunit) # what the installed head unit's base directory looks like
+
+# hmi_add_library(<name> SOURCES ... HEADERS ... [FORWARD Class A,B ...] [NAMESPACE ns] [PUBLIC ...] [PRIVATE ...]
+#                 [INCLUDE_DIR dir] [COMPONENT c])
+# A shared library with an export header, forwarding headers <name/Class>, soname 1 and an install rule.
+# `A,B` makes forwarding headers A and B for a.h.
+function(hmi_add_library name)
+    cmake_parse_arguments(ARG "" "NAMESPACE;INCLUDE_DIR;EXPORT" "SOURCES;HEADERS;FORWARD;PUBLIC;PRIVATE" ${ARGN})
+    add_library(${name} SHARED ${ARG_SOURCES} ${ARG_HEADERS})
+    add_library(${ARG_NAMESPACE}::${name} ALIAS ${name})
+    set(forwarding ${CMAKE_CURRENT_BINARY_DIR}/include/${name})
+    string(TOLOWER ${name} lower)
+    string(TOUPPER ${name} upper)
+    generate_export_header(${name} BASE_NAME ${name} EXPORT_MACRO_NAME ${upper}_EXPORT
+        EXPORT_FILE_NAME ${forwarding}/${lower}_export.h)
+    ecm_generate_headers(forwarded HEADER_NAMES ${ARG_FORWARD} OUTPUT_DIR ${forwarding}
+        RELATIVE ${ARG_INCLUDE_DIR}/${name} REQUIRED_HEADERS required)
+    target_include_directories(${name}
+        PUBLIC "$<BUILD_INTERFACE:${CMAKE_CURRENT_BINARY_DIR}/include>"
+               "$<BUILD_INTERFACE:${CMAKE_CURRENT_SOURCE_DIR}/${ARG_INCLUDE_DIR}>"
+               "$<BUILD_INTERFACE:${CMAKE_CURRENT_SOURCE_DIR}/${ARG_INCLUDE_DIR}/${name}>"
+               "$<BUILD_INTERFACE:${forwarding}>" # lets a forwarded header find its neighbours, as when installed
+               "$<INSTALL_INTERFACE:${CMAKE_INSTALL_INCLUDEDIR}>")
+    target_link_libraries(${name} PUBLIC ${ARG_PUBLIC} PRIVATE ${ARG_PRIVATE})
+    set_target_properties(${name} PROPERTIES VERSION ${PROJECT_VERSION} SOVERSION ${PROJECT_VERSION_MAJOR})
+    install(TARGETS ${name} EXPORT ${ARG_EXPORT} COMPONENT ${ARG_EXPORT})
+    install(FILES ${forwarded} ${ARG_HEADERS} ${forwarding}/${lower}_export.h
+        DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}/${name} COMPONENT ${ARG_EXPORT})
+endfunction()
+
+# hmi_install_package(<name> NAMESPACE ns): installs the export set <name> and a package config made from <name>Config.cmake.in.
+function(hmi_install_package name)
+    cmake_parse_arguments(ARG "" "NAMESPACE" "" ${ARGN})
+    set(destination ${CMAKE_INSTALL_LIBDIR}/cmake/${name})
+    install(EXPORT ${name} FILE ${name}Targets.cmake NAMESPACE ${ARG_NAMESPACE}:: DESTINATION ${destination} COMPONENT ${name})
+    configure_package_config_file(${name}Config.cmake.in ${CMAKE_CURRENT_BINARY_DIR}/${name}Config.cmake
+        INSTALL_DESTINATION ${destination})
+    write_basic_package_version_file(${CMAKE_CURRENT_BINARY_DIR}/${name}ConfigVersion.cmake COMPATIBILITY SameMajorVersion)
+    install(FILES ${CMAKE_CURRENT_BINARY_DIR}/${name}Config.cmake ${CMAKE_CURRENT_BINARY_DIR}/${name}ConfigVersion.cmake
+        DESTINATION ${destination} COMPONENT ${name})
+endfunction()
+
+# hmi_add_resources(<target> PREFIX /p FILES ...): compiles files into the target; on Qt 5 the QML ahead of time.
+function(hmi_add_resources target)
+    cmake_parse_arguments(ARG "" "PREFIX" "FILES" ${ARGN})
+    set(entries "")
+    foreach(file IN LISTS ARG_FILES)
+        string(APPEND entries "    <file alias=\"${file}\">${CMAKE_CURRENT_SOURCE_DIR}/${file}</file>\n")
+    endforeach()
+    string(MAKE_C_IDENTIFIER "${target}${ARG_PREFIX}" stem)
+    set(qrc ${CMAKE_CURRENT_BINARY_DIR}/${stem}.qrc)
+    file(CONFIGURE OUTPUT ${qrc} CONTENT "<RCC>\n  <qresource prefix=\"${ARG_PREFIX}\">\n${entries}  </qresource>\n</RCC>\n" @ONLY)
+    if(QT_VERSION_MAJOR EQUAL 5)
+        find_package(Qt5QuickCompiler REQUIRED)
+        qtquick_compiler_add_resources(generated ${qrc})
+    else()
+        qt_add_resources(generated ${qrc})
+    endif()
+    target_sources(${target} PRIVATE ${generated})
+endfunction()
+
+# hmi_add_test(<tst_name> [SOURCES ...] [LINK ...]): one QtTest executable, run headless with a deadline.
+function(hmi_add_test name)
+    cmake_parse_arguments(ARG "" "TIMEOUT" "SOURCES;LINK;ENVIRONMENT" ${ARGN})
+    if(NOT ARG_SOURCES)
+        set(ARG_SOURCES ${name}.cpp)
+    endif()
+    if(NOT ARG_TIMEOUT)
+        set(ARG_TIMEOUT 120)
+    endif()
+    add_executable(${name} ${ARG_SOURCES})
+    target_link_libraries(${name} PRIVATE HmiTestSupport Qt${QT_VERSION_MAJOR}::Test ${ARG_LINK})
+    add_test(NAME ${name} COMMAND ${name})
+    set_tests_properties(${name} PROPERTIES TIMEOUT ${ARG_TIMEOUT}
+        ENVIRONMENT "QT_QPA_PLATFORM=offscreen;QT_QUICK_BACKEND=software;LC_ALL=C.UTF-8;${HMI_TEST_ENVIRONMENT};${ARG_ENVIRONMENT}")
+endfunction()
