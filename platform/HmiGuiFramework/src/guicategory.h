@@ -1,0 +1,11 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QLoggingCategory>
+
+namespace HmiGuiFramework {
+
+/// Category "hmi.gui": what the framework refuses or cannot do.
+QLoggingCategory& guiCategory();
+
+} // namespace HmiGuiFramework

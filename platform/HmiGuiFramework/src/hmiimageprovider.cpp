@@ -1,0 +1,124 @@
+// SPDX-License-Identifier: MIT
+#include "hmiimageprovider.h"
+
+#include "appsettings.h"
+#include "currentpalette.h"
+#include "guicategory.h"
+
+#include <QColor>
+#include <QFile>
+#include <QPainter>
+#include <QSvgRenderer>
+#include <QUrlQuery>
+
+namespace HmiGuiFramework {
+
+QString HmiImageProvider::imageProviderName = QStringLiteral("hmiimages");
+
+namespace {
+
+constexpr int largestSide = 2048; // pixels; a larger request is a mistake in QML
+
+/// The icon's file, or an empty string. Names cannot lead out of the icon folders.
+QString fileOf(const QString& name)
+{
+    if (name.isEmpty() || name.contains(QLatin1String("..")))
+        return QString();
+    const QString folders[] = {QStringLiteral(":/icons/"), AppSettings::mainFolderPath + QStringLiteral("icons/")};
+    for (const QString& folder : folders)
+        for (const char* const suffix : {".svg", ".png"})
+            if (const QString file = folder + name + QLatin1String(suffix); QFile::exists(file))
+                return file;
+    return QString();
+}
+
+QImage drawSvg(const QString& file, const QColor& color, const QSize& requestedSize)
+{
+    QFile svg(file);
+    if (!svg.open(QIODevice::ReadOnly))
+        return QImage();
+    QSvgRenderer renderer(svg.readAll().replace("currentColor", color.name().toLatin1()));
+    QSize size = renderer.defaultSize();
+    if (requestedSize.isValid())
+        size.scale(requestedSize.boundedTo(QSize(largestSide, largestSide)), Qt::KeepAspectRatio);
+    if (size.isEmpty())
+        return QImage();
+    QImage image(size, QImage::Format_ARGB32_Premultiplied);
+    image.fill(Qt::transparent);
+    QPainter painter(&image);
+    painter.setOpacity(color.alphaF());
+    renderer.render(&painter);
+    return image;
+}
+
+QImage draw(const QString& file, const QColor& color, const QSize& requestedSize)
+{
+    if (file.endsWith(QLatin1String(".svg")))
+        return drawSvg(file, color, requestedSize);
+    const QImage image(file);
+    if (!requestedSize.isValid() || image.isNull())
+        return image;
+    return image.scaled(requestedSize.boundedTo(QSize(largestSide, largestSide)), Qt::KeepAspectRatio, Qt::SmoothTransformation);
+}
+
+/// QML's sourceSize may give one side only.
+QSize complete(const QSize& requested)
+{
+    if (requested.width() > 0 && requested.height() <= 0)
+        return QSize(requested.width(), largestSide);
+    if (requested.height() > 0 && requested.width() <= 0)
+        return QSize(largestSide, requested.height());
+    return requested.isEmpty() ? QSize() : requested;
+}
+
+} // namespace
+
+HmiImageProvider::HmiImageProvider()
+    : QQuickImageProvider(QQuickImageProvider::Image)
+    , m_cache(cacheLimit)
+{
+}
+
+HmiImageProvider::~HmiImageProvider() = default;
+
+QImage HmiImageProvider::requestImage(const QString& id, QSize* size, const QSize& requestedSize)
+{
+    const QString key = QStringLiteral("%1@%2x%3").arg(id).arg(requestedSize.width()).arg(requestedSize.height());
+    {
+        const QMutexLocker lock(&m_mutex);
+        if (const QImage* const cached = m_cache.object(key)) {
+            if (size)
+                *size = cached->size();
+            return *cached;
+        }
+    }
+    const QString name = id.section(QLatin1Char('?'), 0, 0);
+    const QUrlQuery query(id.section(QLatin1Char('?'), 1));
+    const QString wanted = query.queryItemValue(QStringLiteral("color"), QUrl::FullyDecoded);
+    QColor color = CurrentPalette::color(wanted.isEmpty() ? QStringLiteral("onSurface") : wanted);
+    if (!color.isValid())
+        color = Qt::white;
+    const QString file = fileOf(name);
+    const QImage image = file.isEmpty() ? QImage() : draw(file, color, complete(requestedSize));
+    if (image.isNull())
+        qCWarning(guiCategory).noquote() << "icon" << name.left(128) << (file.isEmpty() ? "does not exist" : "cannot be drawn");
+    if (size)
+        *size = image.size();
+    const QMutexLocker lock(&m_mutex);
+    m_cache.insert(key, new QImage(image), qMax(1, int(image.sizeInBytes())));
+    return image;
+}
+
+void HmiImageProvider::clearCache()
+{
+    const QMutexLocker lock(&m_mutex);
+    m_cache.clear();
+}
+
+int HmiImageProvider::cachedBytes() const
+{
+    const QMutexLocker lock(&m_mutex);
+    return int(m_cache.totalCost());
+}
+
+} // namespace HmiGuiFramework
