@@ -1,0 +1,13 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "sourceinfo.h"
+
+#include <QJsonValue>
+
+namespace AL2HMIBridge {
+
+/// Turns a JSON value into what \a spec asks for. The result is empty, or says what is wrong with the value.
+QString decodeValue(const QJsonValue& json, const ValueSpec& spec, Value* value);
+
+} // namespace AL2HMIBridge
