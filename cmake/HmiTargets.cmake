@@ -1,7 +1,8 @@
 # SPDX-License-Identifier: MIT
 # The few functions with which every folder declares its targets.
 
-set(HMI_BASE_DIR ${CMAKE_BINARY_DIR}/headunit) # what the installed head unit's base directory looks like
+set(HMI_BASE_DIR ${CMAKE_BINARY_DIR}/headunit/base) # what the installed head unit looks like
+set(HMI_HEADUNIT_DIR ${CMAKE_INSTALL_LIBDIR}/headunit) # where it is installed: bin/, plugins/, settings/, …
 
 # hmi_add_library(<name> SOURCES ... HEADERS ... [FORWARD Class A,B ...] [NAMESPACE ns] [PUBLIC ...] [PRIVATE ...]
 #                 [INCLUDE_DIR dir] [COMPONENT c])
@@ -43,7 +44,8 @@ function(hmi_install_package name)
         DESTINATION ${destination} COMPONENT ${name})
 endfunction()
 
-# hmi_add_resources(<target> PREFIX /p FILES ...): compiles files into the target; on Qt 5 the QML ahead of time.
+# hmi_add_resources(<target> PREFIX /p FILES ...): compiles files into the target; on Qt 5 the QML ahead of time, for
+# which Qt 5 allows one call per folder.
 function(hmi_add_resources target)
     cmake_parse_arguments(ARG "" "PREFIX" "FILES" ${ARGN})
     set(entries "")
@@ -53,9 +55,11 @@ function(hmi_add_resources target)
     string(MAKE_C_IDENTIFIER "${target}${ARG_PREFIX}" stem)
     set(qrc ${CMAKE_CURRENT_BINARY_DIR}/${stem}.qrc)
     file(CONFIGURE OUTPUT ${qrc} CONTENT "<RCC>\n  <qresource prefix=\"${ARG_PREFIX}\">\n${entries}  </qresource>\n</RCC>\n" @ONLY)
-    if(QT_VERSION_MAJOR EQUAL 5)
+    if(QT_VERSION_MAJOR EQUAL 5 AND entries MATCHES "[.]qml<")
         find_package(Qt5QuickCompiler REQUIRED)
         qtquick_compiler_add_resources(generated ${qrc})
+    elseif(QT_VERSION_MAJOR EQUAL 5)
+        qt5_add_resources(generated ${qrc})
     else()
         qt_add_resources(generated ${qrc})
     endif()
@@ -76,4 +80,20 @@ function(hmi_add_test name)
     add_test(NAME ${name} COMMAND ${name})
     set_tests_properties(${name} PROPERTIES TIMEOUT ${ARG_TIMEOUT}
         ENVIRONMENT "QT_QPA_PLATFORM=offscreen;QT_QUICK_BACKEND=software;LC_ALL=C.UTF-8;${HMI_TEST_ENVIRONMENT};${ARG_ENVIRONMENT}")
+endfunction()
+
+# hmi_add_module(<name> SOURCES ... QML ... FILES ...): an HMI module plugin of the reference head unit.
+# QML files and FILES (view descriptors) are found under ":/<name>", files of icons/ under ":/icons".
+function(hmi_add_module name)
+    cmake_parse_arguments(ARG "" "" "SOURCES;QML;FILES" ${ARGN})
+    set(target hmi_module_${name})
+    file(GLOB icons RELATIVE ${CMAKE_CURRENT_SOURCE_DIR} CONFIGURE_DEPENDS icons/*.svg)
+    add_library(${target} MODULE ${ARG_SOURCES})
+    target_link_libraries(${target} PRIVATE HmiCore::HmiCore)
+    hmi_add_resources(${target} PREFIX /${name} FILES ${ARG_QML} ${ARG_FILES})
+    if(icons)
+        hmi_add_resources(${target} PREFIX / FILES ${icons})
+    endif()
+    set_target_properties(${target} PROPERTIES LIBRARY_OUTPUT_DIRECTORY ${HMI_BASE_DIR}/plugins)
+    install(TARGETS ${target} LIBRARY DESTINATION ${HMI_HEADUNIT_DIR}/plugins COMPONENT headunit)
 endfunction()

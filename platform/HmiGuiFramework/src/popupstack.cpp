@@ -98,6 +98,11 @@ void PopupStack::leaveRegion(PopupState* state)
         machine->requestState(state->parentState()->initialState());
 }
 
+bool PopupStack::stateEntered(NamedState* state)
+{
+    return m_expected.remove(state);
+}
+
 void PopupStack::stateExited(NamedState* state)
 {
     // Whoever shows another popup or removes this one has changed the top by now.
@@ -130,6 +135,8 @@ bool PopupStack::showTop(QString* error)
         *error = QStringLiteral("the state machine does not run");
         return false;
     }
+    if (!entry.state->active())
+        m_expected.insert(entry.state.data());
     if (item->metaObject()->indexOfProperty("popupData") >= 0)
         item->setProperty("popupData", entry.data);
     if (m_shown == entry.descriptor.identifier && m_item == item)

@@ -5,6 +5,7 @@
 
 #include <QPointer>
 #include <QQuickItem>
+#include <QSet>
 #include <QTimer>
 #include <QVector>
 
@@ -38,6 +39,9 @@ public:
 
     void remove(const QString& name);
 
+    /// The machine has entered a popup's state. True when this stack had asked for that.
+    bool stateEntered(HmiStateMachine::NamedState* state);
+
     /// The machine has left a popup's state. If nobody asked for that here, the popup is gone.
     void stateExited(HmiStateMachine::NamedState* state);
 
@@ -63,6 +67,7 @@ private:
     ViewCache* const m_cache;
     QPointer<QQuickItem> m_area;
     QVector<Entry> m_entries; // last is topmost
+    QSet<QObject*> m_expected; // states that were requested and are not entered yet; never followed
     QString m_shown;
     QPointer<QQuickItem> m_item;
     QTimer m_timeout;

@@ -27,7 +27,7 @@ QQuickItem* ViewCache::item(const QString& name, const QUrl& url, QString* error
     auto& component = m_components[url];
     if (!component)
         component = std::make_shared<QQmlComponent>(m_engine, url, QQmlComponent::PreferSynchronous);
-    std::unique_ptr<QObject> object(component->create());
+    std::unique_ptr<QObject> object(component->isReady() ? component->create() : nullptr);
     auto* const item = qobject_cast<QQuickItem*>(object.get());
     if (!item) {
         *error = component->isError() ? component->errorString().trimmed() : QStringLiteral("its root is not an item");

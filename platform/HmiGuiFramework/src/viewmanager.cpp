@@ -112,11 +112,16 @@ void ViewManager::setShell(const QUrl& url)
     if (auto* const area = shell->property("popupArea").value<QQuickItem*>())
         m_popups->setArea(area);
     const auto fitView = [this] {
-        if (QQuickItem* const view = m_cache->existing(m_currentView); view && !m_currentView.isEmpty())
+        if (QQuickItem* const view = currentItem())
             view->setSize(m_viewArea->size());
     };
     connect(m_viewArea, &QQuickItem::widthChanged, this, fitView);
     connect(m_viewArea, &QQuickItem::heightChanged, this, fitView);
+}
+
+QQuickItem* ViewManager::currentItem() const
+{
+    return m_currentView.isEmpty() ? nullptr : m_cache->existing(m_currentView);
 }
 
 QString ViewManager::currentPopup() const
@@ -194,15 +199,20 @@ void ViewManager::requestNextOfBatch()
 bool ViewManager::back()
 {
     NamedState* const state = StateMachine::instance()->findState(m_currentView);
-    auto* const layered = state ? qobject_cast<HmiLayeredState*>(state->parentState()) : nullptr;
-    m_goingBack = layered && layered->back();
-    return m_goingBack;
+    for (QState* ancestor = state ? state->parentState() : nullptr; ancestor; ancestor = ancestor->parentState()) {
+        auto* const layered = qobject_cast<HmiLayeredState*>(ancestor);
+        if (layered && layered->back()) {
+            m_goingBack = true;
+            return true;
+        }
+    }
+    return false;
 }
 
 void ViewManager::stateEntered(NamedState* state)
 {
     if (m_descriptor.popups.contains(state->name()) && qobject_cast<PopupState*>(state)) {
-        if (currentPopup() != state->name())
+        if (!m_popups->stateEntered(state) && currentPopup() != state->name())
             requestPopup(state->name());
         return;
     }
@@ -247,7 +257,7 @@ void ViewManager::showNextView()
     }
     if (request.data.isValid())
         setIfPresent(incoming, "viewData", request.data);
-    QQuickItem* const outgoing = m_currentView.isEmpty() ? nullptr : m_cache->existing(m_currentView);
+    QQuickItem* const outgoing = currentItem();
     incoming->setParentItem(m_viewArea);
     incoming->setSize(m_viewArea->size());
     const bool changed = name != m_currentView;
@@ -315,7 +325,7 @@ void ViewManager::applyVariation()
 
 void ViewManager::currentViewIdle()
 {
-    QQuickItem* const view = m_currentView.isEmpty() ? nullptr : m_cache->existing(m_currentView);
+    QQuickItem* const view = currentItem();
     if (view && view->metaObject()->indexOfMethod("viewIdle()") >= 0)
         QMetaObject::invokeMethod(view, "viewIdle");
 }

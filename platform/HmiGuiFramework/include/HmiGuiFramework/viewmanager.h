@@ -36,6 +36,7 @@ class HMIGUIFRAMEWORK_EXPORT ViewManager : public QObject
 {
     Q_OBJECT
     Q_PROPERTY(QString currentView READ currentView NOTIFY currentViewChanged)
+    Q_PROPERTY(QQuickItem* currentItem READ currentItem NOTIFY currentViewChanged)
     Q_PROPERTY(QString currentPopup READ currentPopup NOTIFY currentPopupChanged)
     Q_PROPERTY(QQuickItem* stage READ stage CONSTANT)
 
@@ -58,6 +59,7 @@ public:
     void loadModule(const QString& viewDescriptor, const QString& prefixOrId, int flagOrDomain);
 
     QString currentView() const { return m_currentView; }   ///< identifier of the view on the screen; empty before the first
+    QQuickItem* currentItem() const;                        ///< its item, or null before the first
     QString currentPopup() const;                           ///< identifier of the topmost popup, or empty
     QQuickItem* stage() const { return m_stage.get(); }     ///< what the window shows; owned by the manager
 
@@ -73,9 +75,9 @@ public:
     /// \brief Asks for several views, each as soon as the one before is on the screen or was refused.
     void requestViews(const QStringList& names);
 
-    /// \brief Goes to the layer beneath the current view in its layered state, with the transition reversed.
+    /// \brief Goes to the layer beneath the current view, with the transition reversed.
     ///
-    /// False, without effect, when the current view lies in no layered state or is its lowest layer.
+    /// That of the innermost layered state which has one; false, without effect, when none has.
     Q_INVOKABLE bool back();
 
     /// \brief Puts a popup on the stack; the topmost one is shown and its state entered. Asked for again it moves up and

@@ -1,0 +1,26 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QSize>
+#include <QString>
+#include <QStringList>
+
+/// What the head unit was asked to do on its command line.
+struct CommandLine
+{
+    enum Outcome { Run, Done, Wrong };
+
+    /// Reads the arguments. Done means that the text asked for (help, version) is in \ref message; Wrong, that \ref message
+    /// says what is wrong with them.
+    static CommandLine parse(const QStringList& arguments);
+
+    Outcome outcome = Run;
+    QString message;
+    QString vehicleDirectory; ///< empty for the vehicle that is built in
+    QString shotFile;         ///< empty to run
+    QString view;             ///< view or popup to show, empty for the start screen
+    QString recordFile;       ///< empty for no recording
+    QSize size{1280, 720};
+    bool night = false;
+    bool listViews = false;
+};

@@ -1,0 +1,118 @@
+// SPDX-License-Identifier: MIT
+#include "commandline.h"
+#include "productinitializer.h"
+#include "screenshot.h"
+
+#include <AL2HMIBridge/BridgeEndpoint>
+#include <HmiCore/HmiApplication>
+#include <HmiCore/HmiManager>
+#include <HmiGuiFramework/AppSettings>
+#include <HmiGuiFramework/DataStore>
+#include <HmiGuiFramework/TransitionManager>
+#include <HmiGuiFramework/ViewManager>
+#include <HmiLogging/MessageHandler>
+#include <HmiVehicle/EmbeddedVehicle>
+
+#include <QDir>
+#include <QFont>
+#include <QTextStream>
+
+#include <memory>
+
+using AL2HMIBridge::BridgeEndpoint;
+using HmiCore::HmiApplication;
+using HmiCore::HmiManager;
+using HmiGuiFramework::AppSettings;
+using HmiGuiFramework::DataStore;
+using HmiGuiFramework::TransitionManager;
+using HmiGuiFramework::ViewManager;
+
+namespace {
+
+constexpr int wrongUsage = 2;
+
+/// Pictures are drawn without a display and without the pace of one.
+void drawOffScreen()
+{
+    qputenv("QT_QPA_PLATFORM", "offscreen");
+    qputenv("QT_QUICK_BACKEND", "software");
+}
+
+void applySettings(const CommandLine& commandLine)
+{
+    QDir base(QCoreApplication::applicationDirPath());
+    HmiApplication::moveToBaseDir(base);
+    AppSettings::mainFolderPath = base.absolutePath() + QLatin1Char('/');
+    AppSettings::frameworkImportPath = QStringLiteral("qml");
+    AppSettings::instance()->setThemeFile(QStringLiteral(":/theme/theme.json"));
+    AppSettings::instance()->setWindowSize(commandLine.size);
+
+    QFont font;
+    font.setFamilies({QStringLiteral("Inter"), QStringLiteral("Noto Sans Arabic"), QStringLiteral("WenQuanYi Micro Hei")});
+    QGuiApplication::setFont(font);
+}
+
+int listViews()
+{
+    const auto descriptor = DataStore::get<ViewManager>(QStringLiteral("ViewManager"))->guiDescriptor();
+    QStringList names = descriptor.views.keys() + descriptor.popups.keys();
+    names.sort();
+    QTextStream(stdout) << names.join(QLatin1Char('\n')) << '\n';
+    return 0;
+}
+
+int run(HmiApplication& application, const CommandLine& commandLine)
+{
+    ProductInitializer initializer(commandLine.night);
+    application.initialize(&initializer);
+    if (commandLine.listViews)
+        return listViews();
+    QString unknown;
+    if (!commandLine.view.isEmpty() && !Screenshot::isKnown(commandLine.view, &unknown)) {
+        QTextStream(stderr) << "headunit: " << unknown << '\n';
+        return wrongUsage;
+    }
+    application.startHmi();
+    Q_EMIT HmiManager::instance()->showHmiUI();
+
+    if (!commandLine.shotFile.isEmpty()) {
+        DataStore::get<TransitionManager>(QStringLiteral("TransitionManager"))->setDuration(0);
+        auto* const screenshot = new Screenshot(commandLine.shotFile, commandLine.view, &application);
+        screenshot->start();
+    }
+    return application.exec();
+}
+
+} // namespace
+
+int main(int argc, char** argv)
+{
+    QStringList arguments;
+    for (int i = 0; i < argc; ++i)
+        arguments.append(QString::fromLocal8Bit(argv[i]));
+    const CommandLine commandLine = CommandLine::parse(arguments);
+    if (commandLine.outcome != CommandLine::Run) {
+        QTextStream(commandLine.outcome == CommandLine::Done ? stdout : stderr) << commandLine.message << '\n';
+        return commandLine.outcome == CommandLine::Done ? 0 : wrongUsage;
+    }
+
+    const HmiLogging::MessageHandler messageHandler(QStringLiteral("HMI"));
+    const bool headless = !commandLine.shotFile.isEmpty() || commandLine.listViews;
+    if (headless)
+        drawOffScreen();
+
+    // The bridge connects as soon as the application object exists, so its other end has to be there before.
+    std::unique_ptr<HmiVehicle::EmbeddedVehicle> vehicle;
+    if (commandLine.vehicleDirectory.isEmpty()) {
+        vehicle = std::make_unique<HmiVehicle::EmbeddedVehicle>(headless);
+        BridgeEndpoint::setConnector([&vehicle](BridgeEndpoint::Channel channel) {
+            return vehicle->connectChannel(BridgeEndpoint::channelName(channel));
+        });
+    } else {
+        BridgeEndpoint::setDirectory(commandLine.vehicleDirectory);
+    }
+
+    HmiApplication application(argc, argv);
+    applySettings(commandLine);
+    return run(application, commandLine);
+}

@@ -1,0 +1,34 @@
+// SPDX-License-Identifier: MIT
+#include "topstatetree.h"
+
+#include <HmiStateMachine/KeySignalTransition>
+
+using namespace HmiStateMachine;
+
+TopStateTree::TopStateTree(StateMachine* machine)
+{
+    auto* const root = new NamedState(QStringLiteral("Root"), QState::ParallelStates, machine);
+    machine->setInitialState(root);
+    m_views = new HmiState(QStringLiteral("Views"), root);
+    m_launcher = new HmiState(QStringLiteral("SYSTEM.Launcher"), m_views);
+    m_views->setInitialState(m_launcher);
+    m_popups = addPopupRegion(root);
+    m_systemPopups = addPopupRegion(root);
+}
+
+QState* TopStateTree::addPopupRegion(QState* root)
+{
+    auto* const region = new QState(root);
+    region->setInitialState(new QState(region)); // no popup
+    return region;
+}
+
+void TopStateTree::addPopupState(StateLevel level, PopupState* state)
+{
+    state->setParent(level == SystemLevel ? m_systemPopups : m_popups);
+}
+
+QList<QPair<StateLevel, QAbstractTransition*>> TopStateTree::transitions() const
+{
+    return {{ViewLevel, new KeySignalTransition(QStringLiteral("Home"), m_views, m_launcher)}};
+}

@@ -1,0 +1,80 @@
+// SPDX-License-Identifier: MIT
+import QtQuick 2.15
+import HmiUi 1.0
+
+/// The phone that is connected, and its contacts.
+Screen {
+    id: root
+
+    title: qsTr("Phone")
+
+    Card {
+        id: device
+
+        anchors { left: parent.left; top: parent.top; bottom: parent.bottom; leftMargin: Theme.margin; bottomMargin: Theme.margin }
+        width: Math.round(parent.width * 0.32)
+
+        Column {
+            anchors { left: parent.left; right: parent.right; top: parent.top; margins: Theme.margin }
+            spacing: Theme.gap
+
+            Icon {
+                name: "bluetooth"
+                size: Theme.px(48)
+                color: Theme.accent
+            }
+
+            Label {
+                width: parent.width
+                content: _phoneSource.deviceName.length > 0 ? _phoneSource.deviceName : qsTr("No phone connected")
+                font.pixelSize: Theme.textTitle
+                font.weight: Font.DemiBold
+                wrapMode: Text.Wrap
+                maximumLineCount: 2
+            }
+
+            Label {
+                width: parent.width
+                visible: _phoneSource.deviceName.length > 0
+                content: qsTr("Battery %1 %").arg(_phoneSource.batteryLevel)
+                color: Theme.onSurfaceMuted
+            }
+        }
+
+        PushButton {
+            objectName: "openKeypad"
+            anchors { left: parent.left; right: parent.right; bottom: parent.bottom; margins: Theme.margin }
+            icon: "keypad"
+            text: qsTr("Keypad")
+            active: _phoneSource.deviceName.length > 0
+            onClicked: _viewManager.requestView("PHONE.Keypad")
+        }
+    }
+
+    Label {
+        anchors.centerIn: contacts
+        visible: contacts.count === 0
+        content: qsTr("No contacts")
+        color: Theme.onSurfaceMuted
+    }
+
+    ScrollList {
+        id: contacts
+
+        objectName: "contacts"
+        anchors {
+            left: device.right; right: parent.right; top: parent.top; bottom: parent.bottom
+            leftMargin: Theme.gap; rightMargin: Theme.margin; bottomMargin: Theme.margin
+        }
+        model: _phoneSource.contacts
+
+        delegate: ListRow {
+            objectName: "contact" + index
+            width: contacts.width
+            icon: "contacts"
+            title: modelData.name
+            subtitle: modelData.number
+            onClicked: _phoneSource.dial(modelData.number)
+        }
+    }
+}

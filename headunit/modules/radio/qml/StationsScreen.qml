@@ -1,0 +1,37 @@
+// SPDX-License-Identifier: MIT
+import QtQuick 2.15
+import HmiUi 1.0
+
+/// All stations of the band that can be received.
+Screen {
+    id: root
+
+    readonly property QtObject tuner: _radio.tuner
+
+    title: qsTr("Stations")
+
+    Label {
+        anchors.centerIn: parent
+        visible: list.count === 0
+        content: qsTr("No stations can be received")
+        color: Theme.onSurfaceMuted
+    }
+
+    ScrollList {
+        id: list
+
+        objectName: "stationList"
+        anchors { fill: parent; leftMargin: Theme.margin; rightMargin: Theme.margin; bottomMargin: Theme.margin }
+        model: root.tuner.stationList
+
+        delegate: ListRow {
+            objectName: "station" + index
+            width: list.width
+            icon: "radio"
+            title: modelData.name ? modelData.name : modelData.frequency
+            value: modelData.name ? modelData.frequency : ""
+            selected: modelData.frequency === root.tuner.frequency
+            onClicked: root.tuner.tuneToStation(index)
+        }
+    }
+}

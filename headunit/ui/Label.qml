@@ -1,0 +1,16 @@
+// SPDX-License-Identifier: MIT
+import QtQuick 2.15
+
+/// Text. Never interprets markup, and shows at most a thousand characters of what comes from outside.
+Text {
+    property string content
+
+    text: content.length > 1000 ? content.substring(0, 1000) : content
+    textFormat: Text.PlainText
+    elide: Text.ElideRight
+    maximumLineCount: 1
+    color: Theme.onSurface
+    font.pixelSize: Theme.textBody
+    horizontalAlignment: Theme.mirrored ? Text.AlignRight : Text.AlignLeft
+    verticalAlignment: Text.AlignVCenter
+}

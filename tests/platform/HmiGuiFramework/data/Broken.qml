@@ -1,0 +1,6 @@
+// SPDX-License-Identifier: MIT
+import QtQuick 2.15
+
+Item {
+    property NoSuchType nothing
+}

@@ -1,0 +1,4 @@
+// SPDX-License-Identifier: MIT
+import QtQml 2.15
+
+QtObject {}
