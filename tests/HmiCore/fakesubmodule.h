@@ -91,7 +91,7 @@ public:
     {
         write(QStringLiteral("Main.qml"), "import QtQuick 2.0\nItem {}\n");
         write(QStringLiteral("views.json"),
-              "{ \"version\": 1, \"views\": [ { \"name\": \"Main\", \"qml\": \"Main.qml\" } ] }");
+              "{ \"version\": 1, \"views\": [ { \"name\": \"Main\", \"url\": \"Main.qml\" } ] }");
         HmiGuiFramework::DataStore::store(&viewManager, QStringLiteral("ViewManager"));
     }
     ~ViewLoading() { HmiGuiFramework::DataStore::store(nullptr, QStringLiteral("ViewManager")); }
