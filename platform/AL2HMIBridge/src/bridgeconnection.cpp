@@ -6,6 +6,14 @@
 
 namespace AL2HMIBridge {
 
+namespace {
+QPointer<BridgeConnection>& present()
+{
+    static QPointer<BridgeConnection> connection;
+    return connection;
+}
+} // namespace
+
 BridgeConnection::BridgeConnection()
     : QObject(QCoreApplication::instance())
 {
@@ -15,10 +23,16 @@ BridgeConnection::~BridgeConnection() = default;
 
 BridgeConnection* BridgeConnection::instance()
 {
-    static QPointer<BridgeConnection> connection;
-    if (!connection)
-        connection = new BridgeConnection;
-    return connection;
+    if (!present())
+        present() = new BridgeConnection;
+    return present();
+}
+
+/// May come when the application object is being destroyed: makes nothing new.
+void BridgeConnection::threadEnded(BridgeEndpoint::Channel channel)
+{
+    if (present())
+        present()->setConnected(channel, false);
 }
 
 void BridgeConnection::setConnected(BridgeEndpoint::Channel channel, bool connected)

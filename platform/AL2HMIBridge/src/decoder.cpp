@@ -13,6 +13,8 @@ namespace AL2HMIBridge {
 
 namespace {
 
+// What is said of a source's line begins with what separates it from the source's name.
+
 constexpr QLatin1String sourceKey("source");
 constexpr QLatin1String stateKey("state");
 constexpr QLatin1String eventKey("event");
@@ -46,18 +48,18 @@ QString decodeState(const QJsonObject& line, Message* message)
     message->kind = Message::State;
     const QJsonValue state = line.value(stateKey);
     if (line.size() != 2 || !state.isObject())
-        return QStringLiteral("\"state\" must be an object and stand alone beside the source");
+        return QStringLiteral(": \"state\" must be an object and stand alone beside the source");
     const QJsonObject values = state.toObject();
     message->fields.reserve(size_t(values.size()));
     for (auto it = values.constBegin(); it != values.constEnd(); ++it) {
         const QString name = it.key();
         const Field* const field = SourceTable::findField(*message->source, name);
         if (!field)
-            return QStringLiteral("%1: no such state").arg(shown(name));
+            return QStringLiteral(".%1: no such state").arg(shown(name));
         message->fields.push_back({field, Value()});
         const QString problem = decodeValue(it.value(), field->spec, &message->fields.back().value);
         if (!problem.isEmpty())
-            return QStringLiteral("%1: %2").arg(name, problem);
+            return QStringLiteral(".%1: %2").arg(name, problem);
     }
     return QString();
 }
@@ -65,13 +67,13 @@ QString decodeState(const QJsonObject& line, Message* message)
 QString decodeArguments(const QJsonArray& values, const Event& event, Message* message)
 {
     if (values.size() != event.arguments.count)
-        return QStringLiteral("%1: %2 arguments instead of %3").arg(event.name).arg(values.size()).arg(event.arguments.count);
+        return QStringLiteral(".%1: %2 arguments instead of %3").arg(event.name).arg(values.size()).arg(event.arguments.count);
     message->arguments.resize(size_t(values.size()));
     for (int i = 0; i < event.arguments.count; ++i) {
         const Argument& argument = event.arguments.first[i];
         const QString problem = decodeValue(values.at(i), argument.spec, &message->arguments[size_t(i)]);
         if (!problem.isEmpty())
-            return QStringLiteral("%1, %2: %3").arg(event.name, argument.name, problem);
+            return QStringLiteral(".%1, %2: %3").arg(event.name, argument.name, problem);
     }
     return QString();
 }
@@ -82,11 +84,11 @@ QString decodeEvent(const QJsonObject& line, Message* message)
     const QJsonValue event = line.value(eventKey);
     const QJsonValue arguments = line.value(argumentsKey);
     if (line.size() != 3 || !event.isString() || !arguments.isArray())
-        return QStringLiteral("an event must have a name and an array \"args\", and nothing else");
+        return QStringLiteral(": an event must have a name and an array \"args\", and nothing else");
     const QString name = event.toString();
     message->event = SourceTable::findEvent(*message->source, name);
     if (!message->event)
-        return QStringLiteral("%1: no such event").arg(shown(name));
+        return QStringLiteral(".%1: no such event").arg(shown(name));
     return decodeArguments(arguments.toArray(), *message->event, message);
 }
 
@@ -105,9 +107,7 @@ QString decodeSourceLine(const QJsonObject& line, BridgeEndpoint::Channel channe
     if (message->source->channel != channel)
         return QStringLiteral("%1: belongs on \"%2\"").arg(name, BridgeEndpoint::channelName(message->source->channel));
     const QString problem = isState ? decodeState(line, message) : decodeEvent(line, message);
-    if (problem.isEmpty())
-        return QString();
-    return name + (message->fields.empty() && !message->event ? QStringLiteral(": ") : QStringLiteral(".")) + problem;
+    return problem.isEmpty() ? QString() : name + problem;
 }
 
 } // namespace

@@ -39,7 +39,9 @@ Q_SIGNALS:
 
 private:
     friend void deliver(Message& message);
+    friend class ReceiveThread;
     BridgeConnection();
+    static void threadEnded(BridgeEndpoint::Channel channel);
     void setConnected(BridgeEndpoint::Channel channel, bool connected);
     void setSynchronised(bool synchronised);
 

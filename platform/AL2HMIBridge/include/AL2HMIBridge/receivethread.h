@@ -32,6 +32,8 @@ protected:
     void run() override;
 
 private:
+    const BridgeEndpoint::Channel m_channel;
+    bool m_begun = false;
     std::unique_ptr<ReceiveLoop> m_loop;
 };
 
