@@ -8,6 +8,7 @@
 #include "hmimodulerootmodel.h"
 #include "hmisubmoduleprovider.h"
 #include "inputmethodengineinterface.h"
+#include "logcategories.h"
 #include "moduleinterface.h"
 #include "pluginfile.h"
 
@@ -29,10 +30,8 @@
 #include <HmiGuiFramework/UiThemeManager>
 #include <HmiGuiFramework/ViewManager>
 #include <HmiGuiFramework/WindowManager>
-#include <HmiLogging/HmiLogging>
 #include <HmiStateMachine/HmiState>
 
-#include <QDebug>
 #include <QDir>
 #include <QFileInfo>
 #include <QQmlContext>
@@ -43,8 +42,6 @@
 #include <utility>
 
 using HmiGuiFramework::DataStore;
-using HmiLogging::hmiperformance;
-using HmiLogging::hmitrace;
 
 namespace HmiCore {
 
@@ -102,8 +99,8 @@ HmiApplication::HmiApplication(int& argc, char** argv)
     m_priorityQueueThread = AL2HMIBridge::MessageReceivePriorityQueueThread::createInstance(this);
     AL2HMIBridge::HMI2ALMessageSender::instance();
     AL2HMIBridge::HMI2NAVMessageSender::instance();
-    qCDebug(hmiperformance) << "starting receive threads";
-    qCDebug(hmitrace) << "starting receive threads";
+    qCDebug(performanceLog) << "starting receive threads";
+    qCDebug(traceLog) << "starting receive threads";
     m_priorityQueueThread->begin();
     m_receiveThread->begin();
     m_touchThread->begin();
@@ -149,7 +146,7 @@ void HmiApplication::createFrameworkObjects()
     m_engine->addImageProvider(HmiImageProvider::imageProviderName, m_imageProvider);
     m_engine->addImageProvider(HmiFrameProvider::imageProviderName, m_frameProvider);
     m_engineOwnsProviders = true;
-    qCDebug(hmicore) << "Framework imports path set.";
+    qCDebug(coreLog) << "Framework imports path set.";
     installCustomLogObjects(m_engine);
 
     m_appSettings = AppSettings::instance();
@@ -173,7 +170,7 @@ void HmiApplication::createFrameworkObjects()
     m_windowManager = new WindowManager(m_appSettings, this);
     DataStore::store(m_windowManager, QStringLiteral("WindowManager"));
     context->setContextProperty(QStringLiteral("_hmiWindow"), m_windowManager->hmiWindow());
-    qCDebug(hmicore) << "Framework objects exported.";
+    qCDebug(coreLog) << "Framework objects exported.";
 }
 
 void HmiApplication::connectFrameworkObjects()
@@ -272,7 +269,7 @@ void HmiApplication::loadModulePlugins()
 {
     QDir directory = baseDir();
     directory.cd(QStringLiteral("plugins")); // without it the base directory is searched
-    qCDebug(hmicore) << "Looking for plugins in:" << directory.absolutePath();
+    qCDebug(coreLog) << "Looking for plugins in:" << directory.absolutePath();
 
     QDir settings = baseDir();
     settings.cd(QStringLiteral("settings"));
@@ -282,23 +279,23 @@ void HmiApplication::loadModulePlugins()
     for (const QString& fileName : fileNames) {
         PluginFile plugin(directory, fileName);
         if (!plugin.hasInterfaceId(qobject_interface_iid<ModuleInterface*>()))
-            qCDebug(hmicore) << fileName << " is not an Hmi Module Plugin. Skipping";
+            qCDebug(coreLog) << fileName << " is not an Hmi Module Plugin. Skipping";
         else if (lists.allow(plugin.name()))
             loadModulePlugin(plugin);
     }
-    qCDebug(hmicore) << "Loaded" << m_moduleIntegrations.size() << "plugins";
+    qCDebug(coreLog) << "Loaded" << m_moduleIntegrations.size() << "plugins";
 }
 
 void HmiApplication::loadModulePlugin(PluginFile& plugin)
 {
     QObject* const root = plugin.rootObject();
     if (!root) {
-        qCDebug(hmicore) << "Failed to load plugin" << plugin.fileName();
+        qCDebug(coreLog) << "Failed to load plugin" << plugin.fileName();
         return;
     }
     auto* const module = qobject_cast<ModuleInterface*>(root);
     if (!module) {
-        qCDebug(hmicore) << "Could not obtain ModuleInterface pointer";
+        qCDebug(coreLog) << "Could not obtain ModuleInterface pointer";
         return;
     }
     createModules(module, plugin.keys());
@@ -309,7 +306,7 @@ void HmiApplication::createModules(ModuleInterface* module, const QStringList& k
     for (const QString& key : keys) {
         HmiModuleIntegration* const integration = module->createModuleIntegration(key, this);
         if (!integration) {
-            qCDebug(hmicore) << "Failed to create module integration for key =" << key;
+            qCDebug(coreLog) << "Failed to create module integration for key =" << key;
             continue;
         }
         m_moduleIntegrations.append(integration);
@@ -327,9 +324,9 @@ void HmiApplication::loadInputMethodPlugins()
     for (const QString& fileName : fileNames) {
         PluginFile plugin(directory, fileName);
         if (!plugin.hasInterfaceId(qobject_interface_iid<InputMethodEngineInterface*>()))
-            qCDebug(hmicore) << fileName << " is not an Hmi Input Method Engine Plugin. Skipping";
+            qCDebug(coreLog) << fileName << " is not an Hmi Input Method Engine Plugin. Skipping";
         else if (!plugin.hasOwnMetaData())
-            qCDebug(hmicore) << fileName << " is missing Hmi Input Method Engine Plugin metadata. Skipping";
+            qCDebug(coreLog) << fileName << " is missing Hmi Input Method Engine Plugin metadata. Skipping";
         else
             loadInputMethodPlugin(plugin);
     }
@@ -339,18 +336,18 @@ void HmiApplication::loadInputMethodPlugin(PluginFile& plugin)
 {
     QObject* const root = plugin.rootObject();
     if (!root) {
-        qCDebug(hmicore) << "Failed to load plugin" << plugin.fileName();
+        qCDebug(coreLog) << "Failed to load plugin" << plugin.fileName();
         return;
     }
     auto* const engine = qobject_cast<InputMethodEngineInterface*>(root);
     if (!engine) {
-        qCDebug(hmicore) << "Could not obtain InputMethodEngineInterface pointer" << plugin.fileName();
+        qCDebug(coreLog) << "Could not obtain InputMethodEngineInterface pointer" << plugin.fileName();
         return;
     }
     const QStringList keys = plugin.keys();
     for (const QString& key : keys)
         if (!engine->registerEngine(key, this))
-            qCDebug(hmicore) << plugin.fileName() << "failed to register input method engine" << key;
+            qCDebug(coreLog) << plugin.fileName() << "failed to register input method engine" << key;
 }
 
 void HmiApplication::registerModules(HmiInitializer* initializer)
@@ -362,7 +359,7 @@ void HmiApplication::registerModules(HmiInitializer* initializer)
     if (home.rootState)
         m_manager->setFactoryDefaultHomeState(home.rootState->name());
     else
-        qCWarning(hmicore) << "No inital state found.";
+        qCWarning(coreLog) << "No inital state found.";
 }
 
 void HmiApplication::registerModule(HmiModuleIntegration* module, HmiInitializer* initializer, HomeCandidate& home)
@@ -386,7 +383,7 @@ void HmiApplication::considerAsHome(const HmiModuleIntegration* module, HmiState
     if (priority < home.priority)
         home = {priority, rootState};
     else if (priority == home.priority)
-        qCWarning(hmicore) << "Possible module priority collision detected in " << module->moduleName()
+        qCWarning(coreLog) << "Possible module priority collision detected in " << module->moduleName()
                            << " priority value " << priority;
 }
 

@@ -1,14 +1,12 @@
 // SPDX-License-Identifier: MIT
 #include "hmihostedsubmodule.h"
 
-#include "hmicore.h"
 #include "hmisubmodulehost.h"
+#include "logcategories.h"
 
 #include <HmiGuiFramework/DataStore>
 #include <HmiGuiFramework/ViewManager>
 #include <HmiStateMachine/HmiState>
-
-#include <QDebug>
 
 namespace HmiCore {
 
@@ -34,7 +32,7 @@ void HmiHostedSubmodule::createSubmodule(HmiSubmoduleHost* host)
 {
     const QString name = host->submoduleHostState()->name();
     if (m_createdIn.contains(name)) {
-        qCWarning(hmicore) << "Submodule creation skipped," << name << "already contains" << submoduleName();
+        qCWarning(coreLog) << "Submodule creation skipped," << name << "already contains" << submoduleName();
         return;
     }
     auto* const viewManager = HmiGuiFramework::DataStore::get<HmiGuiFramework::ViewManager>(QStringLiteral("ViewManager"));
@@ -43,7 +41,7 @@ void HmiHostedSubmodule::createSubmodule(HmiSubmoduleHost* host)
     create(host->submoduleHostState());
     host->addSubmoduleEntryAction(entryAction());
     m_createdIn.append(name);
-    qCDebug(hmicore) << submoduleName() << "Created in" << name;
+    qCDebug(coreLog) << submoduleName() << "Created in" << name;
 }
 
 } // namespace HmiCore

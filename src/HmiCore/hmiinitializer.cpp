@@ -1,24 +1,19 @@
 // SPDX-License-Identifier: MIT
 #include "hmiinitializer.h"
 
-#include "hmicore.h"
 #include "hmimanager.h"
 #include "hmimenuproxymodel.h"
 #include "hmimodulerootmodel.h"
+#include "logcategories.h"
 
 #include <HmiGuiFramework/RequestPopup>
 #include <HmiGuiFramework/RequestView>
-#include <HmiLogging/HmiLogging>
 #include <HmiStateMachine/HmiState>
 #include <HmiStateMachine/KeySignalTransition>
 #include <HmiStateMachine/PopupState>
 
-#include <QDebug>
 #include <QQmlEngine>
 #include <QVariant>
-
-using HmiLogging::hmiperformance;
-using HmiLogging::hmitrace;
 
 namespace HmiCore {
 
@@ -92,33 +87,33 @@ void HmiInitializer::registerComplexKeyboardFactories() {}
 
 void HmiInitializer::initialize(HmiManager* manager, QQmlEngine* engine)
 {
-    qCDebug(hmiperformance) << "initializing application";
-    qCDebug(hmitrace) << "initializing application";
+    qCDebug(performanceLog) << "initializing application";
+    qCDebug(traceLog) << "initializing application";
     preInit(manager);
-    qCDebug(hmicore) << "void HmiCore::HmiInitializer::initialize(HmiCore::HmiManager*, QQmlEngine*)";
+    qCDebug(coreLog) << "void HmiCore::HmiInitializer::initialize(HmiCore::HmiManager*, QQmlEngine*)";
     preInit(manager); // products count on the second run
-    qCDebug(hmiperformance) << "pre init complete";
-    qCDebug(hmitrace) << "pre init complete";
+    qCDebug(performanceLog) << "pre init complete";
+    qCDebug(traceLog) << "pre init complete";
 
     initializeSources();
-    qCDebug(hmicore) << "AL Source objects initialized.";
-    qCDebug(hmiperformance) << "AL Source objects initialized";
-    qCDebug(hmitrace) << "AL Source objects initialized";
+    qCDebug(coreLog) << "AL Source objects initialized.";
+    qCDebug(performanceLog) << "AL Source objects initialized";
+    qCDebug(traceLog) << "AL Source objects initialized";
 
     registerQmlTypes();
-    qCDebug(hmicore) << "Initialized qml types registered.";
-    qCDebug(hmiperformance) << "Initialized qml types registered";
-    qCDebug(hmitrace) << "Initialized qml types registered";
+    qCDebug(coreLog) << "Initialized qml types registered.";
+    qCDebug(performanceLog) << "Initialized qml types registered";
+    qCDebug(traceLog) << "Initialized qml types registered";
 
     exportObjects(engine->rootContext());
-    qCDebug(hmicore) << "Initialized qml objects exported.";
-    qCDebug(hmiperformance) << "Initialized qml objects exported";
-    qCDebug(hmitrace) << "Initialized qml objects exported";
+    qCDebug(coreLog) << "Initialized qml objects exported.";
+    qCDebug(performanceLog) << "Initialized qml objects exported";
+    qCDebug(traceLog) << "Initialized qml objects exported";
 
     buildTopStateTree();
-    qCDebug(hmicore) << "Top state tree built.";
-    qCDebug(hmiperformance) << "Top state tree built.";
-    qCDebug(hmitrace) << "Top state tree built.";
+    qCDebug(coreLog) << "Top state tree built.";
+    qCDebug(performanceLog) << "Top state tree built.";
+    qCDebug(traceLog) << "Top state tree built.";
 
     setUpMenu(manager, createMenuProxyModel(manager));
     manager->setModulesRootState(modulesRootState());
@@ -127,11 +122,11 @@ void HmiInitializer::initialize(HmiManager* manager, QQmlEngine* engine)
     registerHandwritingFactories();
     registerComplexKeyboardFactories();
 
-    qCDebug(hmiperformance) << "beginning postInit";
-    qCDebug(hmitrace) << "beginning postInit";
+    qCDebug(performanceLog) << "beginning postInit";
+    qCDebug(traceLog) << "beginning postInit";
     postInit(manager);
-    qCDebug(hmiperformance) << "finished postInit";
-    qCDebug(hmitrace) << "finished postInit";
+    qCDebug(performanceLog) << "finished postInit";
+    qCDebug(traceLog) << "finished postInit";
 }
 
 void HmiInitializer::finalizeInitialization()

@@ -1,15 +1,14 @@
 // SPDX-License-Identifier: MIT
 #include "hmimanager.h"
 
-#include "hmicore.h"
 #include "hmimodulerootmodel.h"
 #include "identifiertype.h"
+#include "logcategories.h"
 
 #include <HmiStateMachine/HmiState>
 #include <HmiStateMachine/StateMachine>
 
 #include <QCoreApplication>
-#include <QDebug>
 #include <QSortFilterProxyModel>
 
 #include <utility>
@@ -101,7 +100,7 @@ void HmiManager::reportMasterReset()
 
 void HmiManager::stateMachineStopped()
 {
-    qCWarning(hmicore) << "The state machine has stopped.\n"
+    qCWarning(coreLog) << "The state machine has stopped.\n"
                        << "State machine error:" << m_stateMachine->errorString();
 }
 

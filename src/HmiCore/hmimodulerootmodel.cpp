@@ -1,10 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "hmimodulerootmodel.h"
 
-#include "hmicore.h"
 #include "hmimoduleintegration.h"
-
-#include <QDebug>
+#include "logcategories.h"
 
 #include <algorithm>
 
@@ -89,10 +87,10 @@ void HmiModuleRootModel::moduleEnabledChanged(bool enabled)
         return;
     const bool shown = m_modules.contains(module);
     if (enabled && !shown) {
-        qCDebug(hmicore) << "Enabling:" << module->moduleName();
+        qCDebug(coreLog) << "Enabling:" << module->moduleName();
         insertAtEnd(module);
     } else if (!enabled && shown) {
-        qCDebug(hmicore) << "Disabling:" << module->moduleName();
+        qCDebug(coreLog) << "Disabling:" << module->moduleName();
         beginResetModel(); // not a removal of rows: menus rebuild themselves from scratch when a module goes
         m_modules.removeAll(module);
         endResetModel();

@@ -1,14 +1,12 @@
 // SPDX-License-Identifier: MIT
 #include "hmisubmodulefactory.h"
 
-#include "hmicore.h"
+#include "logcategories.h"
 #include "targetstate.h"
 
 #include <HmiGuiFramework/DataStore>
 #include <HmiGuiFramework/ViewManager>
 #include <HmiStateMachine/HmiLayeredState>
-
-#include <QDebug>
 
 namespace HmiCore {
 
@@ -22,7 +20,7 @@ HmiSubmoduleFactory::~HmiSubmoduleFactory() = default;
 void HmiSubmoduleFactory::createSubmodule(const TargetState& target)
 {
     if (m_createdIn.contains(target.state->name())) {
-        qCWarning(hmicore) << "Submodule creation skipped," << target.viewName << "already contains" << submoduleName();
+        qCWarning(coreLog) << "Submodule creation skipped," << target.viewName << "already contains" << submoduleName();
         return;
     }
     auto* const viewManager = HmiGuiFramework::DataStore::get<HmiGuiFramework::ViewManager>(QStringLiteral("ViewManager"));
@@ -30,7 +28,7 @@ void HmiSubmoduleFactory::createSubmodule(const TargetState& target)
         viewManager->loadModule(viewDescriptorFile(), target.viewName, target.domain);
     create(target);
     m_createdIn.append(target.viewName); // not the state's name: modules rely on being built twice under other names
-    qCDebug(hmicore) << submoduleName() << "Created in" << target.viewName;
+    qCDebug(coreLog) << submoduleName() << "Created in" << target.viewName;
 }
 
 } // namespace HmiCore

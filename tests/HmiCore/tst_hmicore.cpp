@@ -39,7 +39,8 @@ private Q_SLOTS:
     void nativeLinesJoinItemsWithBlanksAndQuoteStrings()
     {
         LogCapture log(QStringLiteral("kest.hmicore.debug=true"));
-        qCDebug(hmicore) << "literal" << QStringLiteral("string") << 7;
+        const auto core = []() -> const QLoggingCategory& { return hmicore(); };
+        qCDebug(core) << "literal" << QStringLiteral("string") << 7;
         const QList<LogCapture::Record> records = log.records();
         QCOMPARE(records.size(), 1);
         QCOMPARE(records.first().message, QStringLiteral("literal \"string\" 7"));
