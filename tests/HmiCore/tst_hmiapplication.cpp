@@ -367,7 +367,7 @@ private Q_SLOTS:
         QSignalSpy blacklisted(&manager, &HmiManager::blacklistedModuleRootStateEntered);
         QVERIFY(enter(state.constData()));
         QCOMPARE(activated, announced);
-        QTEST(blacklisted.count(), "blacklisted");
+        QTEST(int(blacklisted.count()), "blacklisted");
         QVERIFY(enter("Start"));
     }
 
