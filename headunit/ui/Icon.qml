@@ -5,7 +5,7 @@ import QtQuick 2.15
 Image {
     property string name
     property url base: name.length > 0 ? "image://hmiimages/" + name : ""
-    property color color: Theme.onSurface
+    property color color: Theme.text
     property real size: Theme.iconSize
     property bool mirrorsWithLayout: false
 

@@ -5,7 +5,7 @@ Tappable {
     id: root
 
     property string icon
-    property color iconColor: Theme.onSurface
+    property color iconColor: Theme.text
     property real iconSize: Theme.iconSize
     property bool mirrorsWithLayout: false
 

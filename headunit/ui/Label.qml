@@ -9,7 +9,7 @@ Text {
     textFormat: Text.PlainText
     elide: Text.ElideRight
     maximumLineCount: 1
-    color: Theme.onSurface
+    color: Theme.text
     font.pixelSize: Theme.textBody
     horizontalAlignment: Theme.mirrored ? Text.AlignRight : Text.AlignLeft
     verticalAlignment: Text.AlignVCenter

@@ -28,7 +28,7 @@ Tappable {
         anchors { left: parent.left; leftMargin: Theme.gap; verticalCenter: parent.verticalCenter }
         visible: root.icon.length > 0
         name: root.icon
-        color: root.selected ? Theme.accent : Theme.onSurfaceMuted
+        color: root.selected ? Theme.accent : Theme.textMuted
     }
 
     Column {
@@ -43,7 +43,7 @@ Tappable {
         Label {
             width: parent.width
             content: root.title
-            color: root.selected ? Theme.accent : Theme.onSurface
+            color: root.selected ? Theme.accent : Theme.text
             opacity: root.dimmed ? 0.4 : 1
         }
 
@@ -51,7 +51,7 @@ Tappable {
             width: parent.width
             visible: root.subtitle.length > 0
             content: root.subtitle
-            color: Theme.onSurfaceMuted
+            color: Theme.textMuted
             font.pixelSize: Theme.textCaption
         }
     }
@@ -59,10 +59,10 @@ Tappable {
     Label {
         id: valueLabel
 
-        anchors { right: trailingSlot.left; rightMargin: content.length > 0 ? Theme.gap / 2 : 0; verticalCenter: parent.verticalCenter }
+        anchors { right: trailingSlot.left; rightMargin: content.length > 0 ? Theme.gap : 0; verticalCenter: parent.verticalCenter }
         width: Math.min(implicitWidth, root.width * 0.4)
         content: root.value
-        color: Theme.onSurfaceMuted
+        color: Theme.textMuted
     }
 
     Row {
@@ -79,7 +79,7 @@ Tappable {
         visible: root.leadsOn
         name: "chevron"
         size: Theme.px(24)
-        color: Theme.onSurfaceMuted
+        color: Theme.textMuted
         mirrorsWithLayout: true
     }
 }

@@ -8,7 +8,7 @@ Tappable {
     property string text
     property bool primary: false
     property color color: primary ? Theme.accent : Theme.surfaceHigh
-    property color textColor: primary ? Theme.onAccent : Theme.onSurface
+    property color textColor: primary ? Theme.accentText : Theme.text
 
     implicitWidth: Math.max(Theme.px(160), content.implicitWidth + 2 * Theme.margin)
     implicitHeight: Theme.touchTarget

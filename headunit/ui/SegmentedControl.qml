@@ -35,7 +35,7 @@ Rectangle {
                     anchors.margins: Theme.gap / 2
                     content: modelData
                     horizontalAlignment: Text.AlignHCenter
-                    color: index === root.current ? Theme.onAccent : Theme.onSurface
+                    color: index === root.current ? Theme.accentText : Theme.text
                     font.weight: Font.DemiBold
                 }
             }

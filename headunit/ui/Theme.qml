@@ -13,14 +13,14 @@ QtObject {
     readonly property color surfaceHigh: colors.surfaceHigh
     readonly property color surfacePressed: colors.surfacePressed
     readonly property color outline: colors.outline
-    readonly property color onSurface: colors.onSurface
-    readonly property color onSurfaceMuted: colors.onSurfaceMuted
+    readonly property color text: colors.text
+    readonly property color textMuted: colors.textMuted
     readonly property color accent: colors.accent
-    readonly property color onAccent: colors.onAccent
+    readonly property color accentText: colors.accentText
     readonly property color accentSoft: colors.accentSoft
     readonly property color positive: colors.positive
     readonly property color negative: colors.negative
-    readonly property color onSignal: colors.onSignal
+    readonly property color signalText: colors.signalText
     readonly property color scrim: colors.scrim
 
     readonly property real scale: Math.min(_hmiWindow.width / values.referenceWidth, _hmiWindow.height / values.referenceHeight)
@@ -40,8 +40,8 @@ QtObject {
     readonly property real textTitle: px(values.textTitle)
     readonly property real textDisplay: px(values.textDisplay)
 
-    readonly property int durationShort: values.durationShort
-    readonly property int durationLong: values.durationLong
+    readonly property int durationShort: AppSettings.animations ? values.durationShort : 0
+    readonly property int durationLong: AppSettings.animations ? values.durationLong : 0
 
     /// Reference pixels in pixels of this window, whole.
     function px(referencePixels) {

@@ -17,33 +17,43 @@ Screen {
         width: Math.round(parent.width * 0.4)
     }
 
-    GridView {
-        id: grid
+    Flickable {
+        id: scroller
 
-        objectName: "launcherGrid"
         anchors {
             left: nowPlaying.right; right: parent.right; top: parent.top; bottom: parent.bottom
-            leftMargin: root.tileGap; rightMargin: Theme.margin - root.tileGap; bottomMargin: Theme.margin - root.tileGap
+            leftMargin: root.tileGap; rightMargin: Theme.margin; bottomMargin: Theme.margin
         }
-        cellWidth: Math.floor(width / 2)
-        cellHeight: Math.floor(height / Math.max(2, Math.min(3, Math.ceil(count / 2))))
-        model: _modulesModel
+        contentHeight: tiles.height
         clip: true
         boundsBehavior: Flickable.StopAtBounds
-        layoutDirection: Theme.mirrored ? Qt.RightToLeft : Qt.LeftToRight
 
-        delegate: Item {
-            width: grid.cellWidth
-            height: grid.cellHeight
+        Flow {
+            id: tiles
 
-            ModuleTile {
-                objectName: "tile" + model.moduleId
-                anchors { fill: parent; rightMargin: root.tileGap; bottomMargin: root.tileGap }
-                iconUrl: model.iconUrl
-                name: model.moduleName
-                active: !model.moduleBlocked
-                isHome: model.moduleRootView === _homeState
-                onClicked: _viewManager.requestView(model.moduleRootView)
+            readonly property real tileHeight: Math.floor((scroller.height - spacing) / 2)
+            readonly property real tileWidth: Math.floor((width - spacing) / 2)
+
+            objectName: "launcherTiles"
+            width: parent.width
+            spacing: root.tileGap
+            layoutDirection: Theme.mirrored ? Qt.RightToLeft : Qt.LeftToRight
+            LayoutMirroring.enabled: false // mirrored by its layout direction
+
+            Repeater {
+                model: _modulesModel
+
+                // The home module is first by its priority, and has a row of its own.
+                ModuleTile {
+                    objectName: "tile" + model.moduleId
+                    width: isHome ? tiles.width : tiles.tileWidth
+                    height: tiles.tileHeight
+                    iconUrl: model.iconUrl
+                    name: model.moduleName
+                    active: !model.moduleBlocked
+                    isHome: model.moduleRootView === _homeState
+                    onClicked: _viewManager.requestView(model.moduleRootView)
+                }
             }
         }
     }

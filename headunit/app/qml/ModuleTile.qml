@@ -25,7 +25,7 @@ Tappable {
             anchors.centerIn: parent
             base: root.iconUrl
             size: Theme.px(46)
-            color: root.isHome ? Theme.onAccent : Theme.accent
+            color: root.isHome ? Theme.accentText : Theme.accent
         }
     }
 

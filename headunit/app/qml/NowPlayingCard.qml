@@ -30,9 +30,25 @@ Card {
         Label {
             width: parent.width
             content: _nowPlaying.subtitle
-            color: Theme.onSurfaceMuted
+            color: Theme.textMuted
             wrapMode: Text.Wrap
             maximumLineCount: 2
+        }
+    }
+
+    Rectangle {
+        anchors.centerIn: parent
+        anchors.verticalCenterOffset: Theme.px(24)
+        width: Theme.px(196)
+        height: width
+        radius: width / 2
+        color: Theme.accentSoft
+
+        Icon {
+            anchors.centerIn: parent
+            name: _nowPlaying.icon
+            size: Theme.px(96)
+            color: Theme.accent
         }
     }
 

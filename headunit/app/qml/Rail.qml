@@ -37,7 +37,7 @@ Rectangle {
             anchors.centerIn: parent
             base: button.iconUrl
             size: Theme.px(38)
-            color: button.current ? Theme.accent : Theme.onSurface
+            color: button.current ? Theme.accent : Theme.text
             opacity: button.active ? 1 : 0.3
             mirrorsWithLayout: button.mirrorsWithLayout
         }

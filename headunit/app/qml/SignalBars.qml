@@ -19,7 +19,7 @@ Row {
             width: Theme.px(4)
             height: Theme.px(7 + index * 4)
             radius: width / 2
-            color: index < root.level ? Theme.onSurface : Theme.outline
+            color: index < root.level ? Theme.text : Theme.outline
         }
     }
 }

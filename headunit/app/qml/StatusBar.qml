@@ -45,7 +45,7 @@ Item {
                 anchors.verticalCenter: parent.verticalCenter
                 name: "bluetooth"
                 size: Theme.px(26)
-                color: Theme.onSurfaceMuted
+                color: Theme.textMuted
             }
 
             SignalBars {
@@ -58,7 +58,7 @@ Item {
             anchors.verticalCenter: parent.verticalCenter
             visible: _bridgeConnection.connected
             content: qsTr("%1 °C").arg(Math.round(_globalSource.outsideTemperature))
-            color: Theme.onSurfaceMuted
+            color: Theme.textMuted
         }
 
         Label {

@@ -2,19 +2,17 @@
 #include "commandline.h"
 #include "productinitializer.h"
 #include "screenshot.h"
+#include "settings.h"
 
 #include <AL2HMIBridge/BridgeEndpoint>
 #include <HmiCore/HmiApplication>
 #include <HmiCore/HmiManager>
 #include <HmiGuiFramework/AppSettings>
 #include <HmiGuiFramework/DataStore>
-#include <HmiGuiFramework/TransitionManager>
 #include <HmiGuiFramework/ViewManager>
 #include <HmiLogging/MessageHandler>
-#include <HmiVehicle/EmbeddedVehicle>
+#include <HmiVehicle/embeddedvehicle.h>
 
-#include <QDir>
-#include <QFont>
 #include <QTextStream>
 
 #include <memory>
@@ -24,7 +22,6 @@ using HmiCore::HmiApplication;
 using HmiCore::HmiManager;
 using HmiGuiFramework::AppSettings;
 using HmiGuiFramework::DataStore;
-using HmiGuiFramework::TransitionManager;
 using HmiGuiFramework::ViewManager;
 
 namespace {
@@ -36,20 +33,6 @@ void drawOffScreen()
 {
     qputenv("QT_QPA_PLATFORM", "offscreen");
     qputenv("QT_QUICK_BACKEND", "software");
-}
-
-void applySettings(const CommandLine& commandLine)
-{
-    QDir base(QCoreApplication::applicationDirPath());
-    HmiApplication::moveToBaseDir(base);
-    AppSettings::mainFolderPath = base.absolutePath() + QLatin1Char('/');
-    AppSettings::frameworkImportPath = QStringLiteral("qml");
-    AppSettings::instance()->setThemeFile(QStringLiteral(":/theme/theme.json"));
-    AppSettings::instance()->setWindowSize(commandLine.size);
-
-    QFont font;
-    font.setFamilies({QStringLiteral("Inter"), QStringLiteral("Noto Sans Arabic"), QStringLiteral("WenQuanYi Micro Hei")});
-    QGuiApplication::setFont(font);
 }
 
 int listViews()
@@ -76,7 +59,6 @@ int run(HmiApplication& application, const CommandLine& commandLine)
     Q_EMIT HmiManager::instance()->showHmiUI();
 
     if (!commandLine.shotFile.isEmpty()) {
-        DataStore::get<TransitionManager>(QStringLiteral("TransitionManager"))->setDuration(0);
         auto* const screenshot = new Screenshot(commandLine.shotFile, commandLine.view, &application);
         screenshot->start();
     }
@@ -104,7 +86,10 @@ int main(int argc, char** argv)
     // The bridge connects as soon as the application object exists, so its other end has to be there before.
     std::unique_ptr<HmiVehicle::EmbeddedVehicle> vehicle;
     if (commandLine.vehicleDirectory.isEmpty()) {
-        vehicle = std::make_unique<HmiVehicle::EmbeddedVehicle>(headless);
+        HmiVehicle::Vehicle::Options options;
+        options.frozen = headless;
+        vehicle = std::make_unique<HmiVehicle::EmbeddedVehicle>(options);
+        vehicle->start();
         BridgeEndpoint::setConnector([&vehicle](BridgeEndpoint::Channel channel) {
             return vehicle->connectChannel(BridgeEndpoint::channelName(channel));
         });
@@ -113,6 +98,7 @@ int main(int argc, char** argv)
     }
 
     HmiApplication application(argc, argv);
-    applySettings(commandLine);
+    applySettings(commandLine.size);
+    AppSettings::instance()->setAnimations(!headless);
     return run(application, commandLine);
 }

@@ -68,6 +68,11 @@ NowPlaying::NowPlaying(QObject* parent)
     update();
 }
 
+QString NowPlaying::icon() const
+{
+    return mainTuner() ? QStringLiteral("radio") : QStringLiteral("media");
+}
+
 void NowPlaying::next()
 {
     if (mainTuner())

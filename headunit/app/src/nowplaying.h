@@ -9,6 +9,7 @@ class NowPlaying : public QObject
 {
     Q_OBJECT
     Q_PROPERTY(QString source READ source NOTIFY changed)
+    Q_PROPERTY(QString icon READ icon NOTIFY changed)
     Q_PROPERTY(QString title READ title NOTIFY changed)
     Q_PROPERTY(QString subtitle READ subtitle NOTIFY changed)
 
@@ -16,6 +17,7 @@ public:
     explicit NowPlaying(QObject* parent);
 
     QString source() const { return m_source; }     ///< name of the audio source
+    QString icon() const;                           ///< name of the icon of its kind
     QString title() const { return m_title; }       ///< station or track
     QString subtitle() const { return m_subtitle; } ///< radio text or artist
 

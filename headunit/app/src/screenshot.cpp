@@ -14,6 +14,8 @@
 #include <QTextStream>
 #include <QTimer>
 
+#include <utility>
+
 using AL2HMIBridge::BridgeConnection;
 using HmiGuiFramework::DataStore;
 using HmiGuiFramework::ViewManager;
@@ -103,7 +105,7 @@ void Screenshot::shoot()
     }
     connect(grab.data(), &QQuickItemGrabResult::ready, this, [this, grab] {
         QDir().mkpath(QFileInfo(m_file).absolutePath());
-        if (grab->saveToFile(m_file))
+        if (std::as_const(*grab).saveToFile(m_file))
             QCoreApplication::exit(0);
         else
             fail(1, QStringLiteral("'%1' cannot be written").arg(m_file));

@@ -46,6 +46,14 @@ void AppSettings::setRightToLeft(bool rightToLeft)
     Q_EMIT rightToLeftChanged();
 }
 
+void AppSettings::setAnimations(bool animations)
+{
+    if (animations == m_animations)
+        return;
+    m_animations = animations;
+    Q_EMIT animationsChanged();
+}
+
 void AppSettings::setThemeFile(const QString& path)
 {
     if (path == m_themeFile)

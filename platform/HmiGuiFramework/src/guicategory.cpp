@@ -5,7 +5,7 @@
 
 namespace HmiGuiFramework {
 
-QLoggingCategory& guiCategory()
+const QLoggingCategory& guiCategory()
 {
     static HmiLogging::HmiLoggingCategory category("hmi.gui", 1);
     return category;

@@ -6,6 +6,6 @@
 namespace HmiGuiFramework {
 
 /// Category "hmi.gui": what the framework refuses or cannot do.
-QLoggingCategory& guiCategory();
+const QLoggingCategory& guiCategory();
 
 } // namespace HmiGuiFramework

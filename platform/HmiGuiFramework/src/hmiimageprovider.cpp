@@ -95,7 +95,7 @@ QImage HmiImageProvider::requestImage(const QString& id, QSize* size, const QSiz
     const QString name = id.section(QLatin1Char('?'), 0, 0);
     const QUrlQuery query(id.section(QLatin1Char('?'), 1));
     const QString wanted = query.queryItemValue(QStringLiteral("color"), QUrl::FullyDecoded);
-    QColor color = CurrentPalette::color(wanted.isEmpty() ? QStringLiteral("onSurface") : wanted);
+    QColor color = CurrentPalette::color(wanted.isEmpty() ? QStringLiteral("text") : wanted);
     if (!color.isValid())
         color = Qt::white;
     const QString file = fileOf(name);

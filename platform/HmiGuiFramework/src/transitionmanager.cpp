@@ -71,7 +71,7 @@ void TransitionManager::setDefaultTransition(const QString& name)
 
 TransitionManager::Transition TransitionManager::effective(const QString& name, bool reverse) const
 {
-    if (m_duration <= 0)
+    if (m_duration <= 0 || !AppSettings::instance()->animations())
         return None;
     const Transition transition = transitionsByName().value(isTransition(name) ? name : m_defaultTransition);
     if (transition != SlideForward && transition != SlideBackward)

@@ -4,6 +4,8 @@
 #include <QQmlComponent>
 #include <QQmlEngine>
 
+#include <utility>
+
 namespace HmiGuiFramework {
 
 ViewCache::ViewCache(QQmlEngine* engine)
@@ -13,7 +15,16 @@ ViewCache::ViewCache(QQmlEngine* engine)
 
 ViewCache::~ViewCache()
 {
-    for (const auto& item : std::as_const(m_items))
+    engineDestroyed();
+}
+
+void ViewCache::engineDestroyed()
+{
+    m_engine = nullptr;
+    m_recent.clear();
+    m_components.clear();
+    const auto items = std::exchange(m_items, {});
+    for (const auto& item : items)
         delete item.data();
 }
 
@@ -23,6 +34,10 @@ QQuickItem* ViewCache::item(const QString& name, const QUrl& url, QString* error
     if (QQuickItem* const known = existing(name)) {
         m_recent.append(name);
         return known;
+    }
+    if (!m_engine) {
+        *error = QStringLiteral("the QML engine is gone");
+        return nullptr;
     }
     auto& component = m_components[url];
     if (!component)

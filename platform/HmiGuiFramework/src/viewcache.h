@@ -37,10 +37,13 @@ public:
     /// Drops all items and compiled components. Items are deleted when control returns to the event loop.
     void clear();
 
+    /// Deletes all items and components at once: the engine is gone, and no more can be made.
+    void engineDestroyed();
+
 private:
     void drop(const QString& name);
 
-    QQmlEngine* const m_engine;
+    QQmlEngine* m_engine; // null when gone
     QHash<QUrl, std::shared_ptr<QQmlComponent>> m_components;
     QHash<QString, QPointer<QQuickItem>> m_items;
     QStringList m_recent; // last is the most recently used

@@ -51,7 +51,6 @@ void add(QHash<QString, Value>* table, const QString& key, const Value& value, c
 
 ViewManager::ViewManager(QQmlEngine* engine, TransitionManager* transitionManager, QObject* parent)
     : QObject(parent)
-    , m_engine(engine)
     , m_transitionManager(transitionManager)
     , m_stage(std::make_unique<QQuickItem>())
     , m_viewArea(m_stage.get())
@@ -63,6 +62,8 @@ ViewManager::ViewManager(QQmlEngine* engine, TransitionManager* transitionManage
     connect(transitionManager, &TransitionManager::finished, this, &ViewManager::transitionFinished);
     connect(StateMachine::instance(), &StateMachine::stateEntered, this, &ViewManager::stateEntered);
     connect(StateMachine::instance(), &StateMachine::stateExited, this, &ViewManager::stateExited);
+    // While the application object still stands: items give back what they took from the window.
+    connect(engine, &QObject::destroyed, this, [this] { m_cache->engineDestroyed(); });
     connect(AppSettings::instance(), &AppSettings::uiVariationChanged, this, &ViewManager::applyVariation);
     engine->rootContext()->setContextProperty(QStringLiteral("_viewManager"), this);
 }

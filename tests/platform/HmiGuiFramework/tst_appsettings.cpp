@@ -25,6 +25,7 @@ private Q_SLOTS:
         QTest::newRow("windowSize") << QByteArray("windowSize") << QVariant(QSize(800, 480));
         QTest::newRow("fullScreen") << QByteArray("fullScreen") << QVariant(true);
         QTest::newRow("rightToLeft") << QByteArray("rightToLeft") << QVariant(true);
+        QTest::newRow("animations") << QByteArray("animations") << QVariant(false);
         QTest::newRow("themeFile") << QByteArray("themeFile") << QVariant(QStringLiteral("theme.json"));
         QTest::newRow("uiVariation") << QByteArray("uiVariation") << QVariant(QStringLiteral("compact"));
         QTest::newRow("viewCacheSize") << QByteArray("viewCacheSize") << QVariant(9);

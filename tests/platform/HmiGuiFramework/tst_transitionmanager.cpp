@@ -102,6 +102,16 @@ private Q_SLOTS:
         QCOMPARE(stage.outgoing.isVisible(), !withOutgoing);
     }
 
+    void isOverAtOnceWithoutAnimations()
+    {
+        Stage stage;
+        AppSettings::instance()->setAnimations(false);
+        stage.manager.run(&stage.outgoing, &stage.incoming, QStringLiteral("fade"), false);
+        AppSettings::instance()->setAnimations(true);
+        QVERIFY(!stage.manager.isRunning());
+        QVERIFY(!stage.outgoing.isVisible());
+    }
+
     void theSameItemStaysVisible()
     {
         Stage stage;

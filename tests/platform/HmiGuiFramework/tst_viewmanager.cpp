@@ -239,6 +239,9 @@ private Q_SLOTS:
         machine->start();
         QTRY_COMPARE(views.currentView(), text("M.Home"));
         engine.reset();
+        QCOMPARE(views.currentItem(), nullptr);
+        QVERIFY(!views.requestView(text("M.Home")));
+        QVERIFY(log.takeOne(QtWarningMsg, text("request for \"M.Home\" refused: the QML engine is gone")));
         delete machine;
     }
 };

@@ -48,7 +48,7 @@ Screen {
             width: parent.width
             horizontalAlignment: Text.AlignHCenter
             content: root.connected ? root.clock(_phoneSource.callDuration) : _phoneSource.dialling ? qsTr("Dialling…") : ""
-            color: Theme.onSurfaceMuted
+            color: Theme.textMuted
             font.pixelSize: Theme.textTitle
         }
     }
@@ -73,7 +73,7 @@ Screen {
             text: qsTr("End call")
             icon: "phone-hangup"
             color: Theme.negative
-            textColor: Theme.onSignal
+            textColor: Theme.signalText
             active: root.connected || _phoneSource.dialling
             onClicked: _phoneSource.hangUp()
         }

@@ -37,7 +37,7 @@ Screen {
                 width: parent.width
                 visible: _phoneSource.deviceName.length > 0
                 content: qsTr("Battery %1 %").arg(_phoneSource.batteryLevel)
-                color: Theme.onSurfaceMuted
+                color: Theme.textMuted
             }
         }
 
@@ -51,21 +51,27 @@ Screen {
         }
     }
 
+    Card {
+        id: contactsCard
+
+        anchors {
+            left: device.right; right: parent.right; top: parent.top; bottom: parent.bottom
+            leftMargin: Theme.gap; rightMargin: Theme.margin; bottomMargin: Theme.margin
+        }
+    }
+
     Label {
-        anchors.centerIn: contacts
+        anchors.centerIn: contactsCard
         visible: contacts.count === 0
         content: qsTr("No contacts")
-        color: Theme.onSurfaceMuted
+        color: Theme.textMuted
     }
 
     ScrollList {
         id: contacts
 
         objectName: "contacts"
-        anchors {
-            left: device.right; right: parent.right; top: parent.top; bottom: parent.bottom
-            leftMargin: Theme.gap; rightMargin: Theme.margin; bottomMargin: Theme.margin
-        }
+        anchors { fill: contactsCard; margins: Theme.gap }
         model: _phoneSource.contacts
 
         delegate: ListRow {

@@ -23,7 +23,7 @@ PopupCard {
         width: parent.width
         visible: root.known
         content: _phoneSource.callerNumber
-        color: Theme.onSurfaceMuted
+        color: Theme.textMuted
     }
 
     Row {
@@ -36,7 +36,7 @@ PopupCard {
             text: qsTr("Accept")
             icon: "phone"
             color: Theme.positive
-            textColor: Theme.onSignal
+            textColor: Theme.signalText
             onClicked: _phoneSource.acceptCall()
         }
 
@@ -46,7 +46,7 @@ PopupCard {
             text: qsTr("Reject")
             icon: "phone-hangup"
             color: Theme.negative
-            textColor: Theme.onSignal
+            textColor: Theme.signalText
             onClicked: _phoneSource.rejectCall()
         }
     }

@@ -19,7 +19,7 @@ Screen {
         horizontalAlignment: Text.AlignHCenter
         elide: Text.ElideLeft // the end is what was just typed
         content: root.number.length > 0 ? root.number : qsTr("Enter a number")
-        color: root.number.length > 0 ? Theme.onSurface : Theme.onSurfaceMuted
+        color: root.number.length > 0 ? Theme.text : Theme.textMuted
         font.pixelSize: Theme.px(44)
     }
 
@@ -67,7 +67,7 @@ Screen {
             icon: "phone"
             text: qsTr("Call")
             color: Theme.positive
-            textColor: Theme.onSignal
+            textColor: Theme.signalText
             active: root.number.length > 0
             onClicked: _phoneSource.dial(root.number)
         }

@@ -37,7 +37,7 @@ Item {
             horizontalAlignment: Text.AlignHCenter
             content: root.number
             font.pixelSize: Theme.textCaption
-            color: root.current ? Theme.onAccent : Theme.onSurfaceMuted
+            color: root.current ? Theme.accentText : Theme.textMuted
         }
 
         Label {
@@ -46,7 +46,7 @@ Item {
             wrapMode: Text.Wrap
             maximumLineCount: 2
             content: root.preset.name ? root.preset.name : root.preset.frequency ? root.preset.frequency : "–"
-            color: root.current ? Theme.onAccent : Theme.onSurface
+            color: root.current ? Theme.accentText : Theme.text
             font.weight: Font.DemiBold
             font.pixelSize: Theme.px(22)
         }

@@ -82,7 +82,7 @@ Screen {
                 Label {
                     anchors.baseline: frequency.baseline
                     content: root.tuner.frequencyUnit
-                    color: Theme.onSurfaceMuted
+                    color: Theme.textMuted
                     font.pixelSize: Theme.textTitle
                 }
             }
@@ -102,7 +102,7 @@ Screen {
                 wrapMode: Text.Wrap
                 maximumLineCount: 2
                 content: root.tuner.radioText
-                color: Theme.onSurfaceMuted
+                color: Theme.textMuted
             }
 
             Row {

@@ -10,18 +10,26 @@ Screen {
 
     title: qsTr("Stations")
 
+    Card {
+        anchors { fill: parent; leftMargin: Theme.margin; rightMargin: Theme.margin; bottomMargin: Theme.margin }
+    }
+
     Label {
         anchors.centerIn: parent
         visible: list.count === 0
         content: qsTr("No stations can be received")
-        color: Theme.onSurfaceMuted
+        color: Theme.textMuted
     }
 
     ScrollList {
         id: list
 
         objectName: "stationList"
-        anchors { fill: parent; leftMargin: Theme.margin; rightMargin: Theme.margin; bottomMargin: Theme.margin }
+        anchors {
+            fill: parent
+            leftMargin: Theme.margin + Theme.gap; rightMargin: Theme.margin + Theme.gap
+            topMargin: Theme.gap; bottomMargin: Theme.margin + Theme.gap
+        }
         model: root.tuner.stationList
 
         delegate: ListRow {

@@ -19,6 +19,7 @@ class HMIGUIFRAMEWORK_EXPORT AppSettings : public QObject
     Q_PROPERTY(QSize windowSize READ windowSize WRITE setWindowSize NOTIFY windowSizeChanged)
     Q_PROPERTY(bool fullScreen READ fullScreen WRITE setFullScreen NOTIFY fullScreenChanged)
     Q_PROPERTY(bool rightToLeft READ rightToLeft WRITE setRightToLeft NOTIFY rightToLeftChanged)
+    Q_PROPERTY(bool animations READ animations WRITE setAnimations NOTIFY animationsChanged)
     Q_PROPERTY(QString themeFile READ themeFile WRITE setThemeFile NOTIFY themeFileChanged)
     Q_PROPERTY(QString uiVariation READ uiVariation WRITE setUiVariation NOTIFY uiVariationChanged)
     Q_PROPERTY(int viewCacheSize READ viewCacheSize WRITE setViewCacheSize NOTIFY viewCacheSizeChanged)
@@ -43,6 +44,9 @@ public:
     bool rightToLeft() const { return m_rightToLeft; } ///< whether the layout is mirrored, as for Arabic
     void setRightToLeft(bool rightToLeft);
 
+    bool animations() const { return m_animations; } ///< whether changes on the screen are animated; true by default
+    void setAnimations(bool animations);
+
     QString themeFile() const { return m_themeFile; } ///< theme document; empty for the built-in one
     void setThemeFile(const QString& path);
 
@@ -59,6 +63,7 @@ Q_SIGNALS:
     void windowSizeChanged();
     void fullScreenChanged();
     void rightToLeftChanged();
+    void animationsChanged();
     void themeFileChanged();
     void uiVariationChanged();
     void viewCacheSizeChanged();
@@ -70,6 +75,7 @@ private:
     QSize m_windowSize{1280, 720};
     bool m_fullScreen = false;
     bool m_rightToLeft = false;
+    bool m_animations = true;
     QString m_themeFile;
     QString m_uiVariation;
     int m_viewCacheSize = 5;

@@ -14,7 +14,7 @@ namespace HmiGuiFramework {
 ///
 /// `image://hmiimages/<name>[?color=<role or #rrggbb>]`: the file `<name>.svg` or `<name>.png` of the resource folder
 /// ":/icons" or of "icons/" under AppSettings::mainFolderPath. An SVG's parts that are drawn in `currentColor` get the
-/// colour asked for, by default that of the role "onSurface". Without a requested size an icon has its own. An unknown
+/// colour asked for, by default that of the role "text". Without a requested size an icon has its own. An unknown
 /// name gives one warning and an empty image. Images are kept in a cache of 8 MiB. requestImage() may be called from any
 /// thread.
 class HMIGUIFRAMEWORK_EXPORT HmiImageProvider : public QQuickImageProvider

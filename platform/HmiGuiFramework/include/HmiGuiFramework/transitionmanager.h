@@ -18,7 +18,8 @@ namespace HmiGuiFramework {
 /// \brief Animates the change from one view to the next. GUI thread only.
 ///
 /// Transitions by name: "none", "fade", "slide-forward" (the new view comes from where reading ends) and
-/// "slide-backward"; both slides are mirrored while AppSettings::rightToLeft is set.
+/// "slide-backward"; both slides are mirrored while AppSettings::rightToLeft is set. Without AppSettings::animations every
+/// change is immediate.
 class HMIGUIFRAMEWORK_EXPORT TransitionManager : public QObject
 {
     Q_OBJECT

@@ -126,7 +126,6 @@ private:
     void applyVariation();
     void setShell(const QUrl& url);
 
-    QQmlEngine* const m_engine;
     const QPointer<TransitionManager> m_transitionManager;
     GuiDescriptor m_descriptor;
     TransientCollection m_transients;
