@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include <QCoreApplication>
+#include <QFile>
 #include <QImage>
 #include <QProcess>
 #include <QSet>
@@ -83,6 +84,18 @@ private Q_SLOTS:
         QCOMPARE(QImage(first), QImage(second));
     }
 
+    void theTrafficIsRecordedFromTheFirstLineOn()
+    {
+        const QString recording = m_folder.filePath(QStringLiteral("recording.jsonl"));
+        QCOMPARE(headunit({QStringLiteral("--shot"), m_folder.filePath(QStringLiteral("x.png")), QStringLiteral("--record"), recording}).exitCode, 0);
+        QFile file(recording);
+        QVERIFY(file.open(QIODevice::ReadOnly));
+        const QByteArray lines = file.readAll();
+        QVERIFY(lines.contains("\"peer\":\"hmi\""));
+        QVERIFY(lines.contains("\"peer\":\"application-layer\""));
+        QVERIFY(lines.contains("\"snapshot\":\"complete\""));
+    }
+
     void mistakesEndWithAMessageAndTheirExitCode_data()
     {
         QTest::addColumn<QStringList>("arguments");
@@ -91,6 +104,8 @@ private Q_SLOTS:
         QTest::newRow("unknown view") << QStringList({QStringLiteral("--shot"), QStringLiteral("x.png"), QStringLiteral("--view"), QStringLiteral("Nope")})
                                       << 2 << QStringLiteral("there is no view 'Nope'; there are: PHONE.Call, ");
         QTest::newRow("unknown option") << QStringList({QStringLiteral("--frobnicate")}) << 2 << QStringLiteral("frobnicate");
+        QTest::newRow("recording that cannot be written") << QStringList({QStringLiteral("--shot"), QStringLiteral("x.png"), QStringLiteral("--record"), QStringLiteral("/proc/nothing/r")})
+                                                          << 1 << QStringLiteral("/proc/nothing/r");
         QTest::newRow("file that cannot be written") << QStringList({QStringLiteral("--shot"), QStringLiteral("/proc/nothing/x.png")})
                                                      << 1 << QStringLiteral("'/proc/nothing/x.png' cannot be written");
     }

@@ -5,6 +5,7 @@
 #include "settings.h"
 
 #include <AL2HMIBridge/BridgeEndpoint>
+#include <AL2HMIBridge/BridgeRecorder>
 #include <HmiCore/HmiApplication>
 #include <HmiCore/HmiManager>
 #include <HmiGuiFramework/AppSettings>
@@ -15,17 +16,18 @@
 
 #include <QTextStream>
 
-#include <memory>
-
 using AL2HMIBridge::BridgeEndpoint;
+using AL2HMIBridge::BridgeRecorder;
 using HmiCore::HmiApplication;
 using HmiCore::HmiManager;
 using HmiGuiFramework::AppSettings;
 using HmiGuiFramework::DataStore;
 using HmiGuiFramework::ViewManager;
+using HmiVehicle::EmbeddedVehicle;
 
 namespace {
 
+constexpr int cannotRun = 1;
 constexpr int wrongUsage = 2;
 
 /// Pictures are drawn without a display and without the pace of one.
@@ -33,6 +35,22 @@ void drawOffScreen()
 {
     qputenv("QT_QPA_PLATFORM", "offscreen");
     qputenv("QT_QUICK_BACKEND", "software");
+}
+
+EmbeddedVehicle* vehicle = nullptr;
+
+/// The bridge connects as soon as the application object exists, and the vehicle's thread needs that object: so the vehicle
+/// starts while the object is made, and stops while it is destroyed.
+void useEmbeddedVehicle(bool frozen)
+{
+    HmiVehicle::Vehicle::Options options;
+    options.frozen = frozen;
+    static EmbeddedVehicle embedded(options);
+    vehicle = &embedded;
+    qAddPreRoutine([] { vehicle->start(); });
+    qAddPostRoutine([] { vehicle->stop(); });
+    BridgeEndpoint::setConnector(
+        [](BridgeEndpoint::Channel channel) { return vehicle->connectChannel(BridgeEndpoint::channelName(channel)); });
 }
 
 int listViews()
@@ -83,18 +101,15 @@ int main(int argc, char** argv)
     if (headless)
         drawOffScreen();
 
-    // The bridge connects as soon as the application object exists, so its other end has to be there before.
-    std::unique_ptr<HmiVehicle::EmbeddedVehicle> vehicle;
-    if (commandLine.vehicleDirectory.isEmpty()) {
-        HmiVehicle::Vehicle::Options options;
-        options.frozen = headless;
-        vehicle = std::make_unique<HmiVehicle::EmbeddedVehicle>(options);
-        vehicle->start();
-        BridgeEndpoint::setConnector([&vehicle](BridgeEndpoint::Channel channel) {
-            return vehicle->connectChannel(BridgeEndpoint::channelName(channel));
-        });
-    } else {
+    if (commandLine.vehicleDirectory.isEmpty())
+        useEmbeddedVehicle(headless);
+    else
         BridgeEndpoint::setDirectory(commandLine.vehicleDirectory);
+
+    BridgeRecorder recorder; // before the application object, whose construction starts the traffic
+    if (!commandLine.recordFile.isEmpty() && !recorder.start(commandLine.recordFile)) {
+        QTextStream(stderr) << "headunit: " << recorder.errorString() << '\n';
+        return cannotRun;
     }
 
     HmiApplication application(argc, argv);

@@ -24,7 +24,7 @@ using HmiStateMachine::StateMachine;
 
 namespace {
 
-constexpr int patience = 20000; // ms until a view that does not appear counts as missing
+constexpr int patience = 10000; // ms until a vehicle that does not answer or a view that does not appear counts as missing
 
 ViewManager* viewManager()
 {
@@ -71,8 +71,10 @@ bool Screenshot::isKnown(const QString& view, QString* message)
 
 void Screenshot::start()
 {
-    QTimer::singleShot(patience, this, [this] { fail(1, QStringLiteral("the view did not appear")); });
     auto* const bridge = BridgeConnection::instance();
+    QTimer::singleShot(patience, this, [this, bridge] {
+        fail(1, bridge->synchronised() ? QStringLiteral("the view did not appear") : QStringLiteral("no vehicle has told its state"));
+    });
     whenever(bridge, &BridgeConnection::synchronisedChanged, this, [bridge] { return bridge->synchronised(); }, [this] { showView(); });
 }
 
