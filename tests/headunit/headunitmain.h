@@ -12,11 +12,13 @@
 
 #include <QTest>
 
-/// The head unit as it is, in the test's process and without a vehicle: BridgeTester plays that. Runs the tests of \a Test.
+#include <utility>
+
+/// The head unit as it is, in the test's process, with what \a connector connects it to. Runs the tests of \a Test.
 template <typename Test>
-int runInHeadUnit(int argc, char** argv)
+int runInHeadUnit(int argc, char** argv, AL2HMIBridge::BridgeEndpoint::Connector connector)
 {
-    AL2HMIBridge::BridgeEndpoint::setConnector([](AL2HMIBridge::BridgeEndpoint::Channel) { return -1; });
+    AL2HMIBridge::BridgeEndpoint::setConnector(std::move(connector));
     HmiCore::HmiApplication application(argc, argv);
     applySettings(QSize(1280, 720));
     HmiGuiFramework::AppSettings::instance()->setAnimations(false);
@@ -26,4 +28,11 @@ int runInHeadUnit(int argc, char** argv)
     Q_EMIT HmiCore::HmiManager::instance()->showHmiUI();
     Test test;
     return QTest::qExec(&test, argc, argv);
+}
+
+/// As above, without a vehicle: BridgeTester plays that.
+template <typename Test>
+int runInHeadUnit(int argc, char** argv)
+{
+    return runInHeadUnit<Test>(argc, argv, [](AL2HMIBridge::BridgeEndpoint::Channel) { return -1; });
 }

@@ -91,7 +91,6 @@ private Q_SLOTS:
         QFile file(recording);
         QVERIFY(file.open(QIODevice::ReadOnly));
         const QByteArray lines = file.readAll();
-        QVERIFY(lines.contains("\"peer\":\"hmi\""));
         QVERIFY(lines.contains("\"peer\":\"application-layer\""));
         QVERIFY(lines.contains("\"snapshot\":\"complete\""));
     }
