@@ -143,7 +143,7 @@ void ProductInitializer::watchTransients() const
     QObject::connect(GlobalSource::instance(), &GlobalSource::mutedChanged, statusBar, tellOfVolume);
     QObject::connect(BridgeConnection::instance(), &BridgeConnection::connectedChanged, statusBar,
                      [statusBar, wasConnected = false]() mutable {
-                         if (wasConnected)
+                         if (wasConnected && !QCoreApplication::closingDown())
                              statusBar->requestTransientWidget(QStringLiteral("SYSTEM.Connection"), 0);
                          wasConnected = true;
                      });
