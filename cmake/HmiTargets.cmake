@@ -96,4 +96,17 @@ function(hmi_add_module name)
     endif()
     set_target_properties(${target} PROPERTIES LIBRARY_OUTPUT_DIRECTORY ${HMI_BASE_DIR}/plugins)
     install(TARGETS ${target} LIBRARY DESTINATION ${HMI_HEADUNIT_DIR}/plugins COMPONENT headunit)
+    hmi_add_translations(${name})
+endfunction()
+
+# hmi_add_translations(<name>): makes a target that brings translations/<name>.ts, the catalogue of all texts of this
+# folder, in step with the sources; `update_translations` does so for all.
+function(hmi_add_translations name)
+    if(NOT TARGET update_translations)
+        add_custom_target(update_translations)
+    endif()
+    add_custom_target(update_translations_${name}
+        COMMAND Qt${QT_VERSION_MAJOR}::lupdate -silent -locations none -no-obsolete ${CMAKE_CURRENT_SOURCE_DIR}
+            -ts ${CMAKE_CURRENT_SOURCE_DIR}/translations/${name}.ts)
+    add_dependencies(update_translations update_translations_${name})
 endfunction()

@@ -19,8 +19,12 @@ namespace DltBackend {
 
 namespace {
 
-// libdlt talks to the daemon through this pipe; a pipe that nobody reads refuses to be opened for writing.
-constexpr char daemonPipe[] = "/tmp/dlt";
+/// The pipe through which libdlt talks to the daemon.
+QByteArray daemonPipe()
+{
+    const QByteArray folder = qgetenv("DLT_PIPE_DIR");
+    return (folder.isEmpty() ? QByteArray("/tmp") : folder) + "/dlt";
+}
 
 struct Contexts
 {
@@ -35,9 +39,10 @@ Contexts& contexts()
     return instance;
 }
 
+/// A pipe that nobody reads refuses to be opened for writing.
 bool daemonReads()
 {
-    const int fd = ::open(daemonPipe, O_WRONLY | O_NONBLOCK | O_CLOEXEC);
+    const int fd = ::open(daemonPipe().constData(), O_WRONLY | O_NONBLOCK | O_CLOEXEC);
     if (fd < 0)
         return false;
     ::close(fd);
