@@ -47,7 +47,16 @@ add_compile_definitions(
     QT_MESSAGELOGCONTEXT)
 add_compile_options(-Wall -Wextra -Wpedantic -Wshadow=local -Wnon-virtual-dtor -Woverloaded-virtual -Wcast-qual
     -Wformat-security -Wundef)
+if(CMAKE_CXX_COMPILER_ID STREQUAL "GNU" AND CMAKE_CXX_COMPILER_VERSION VERSION_LESS 13)
+    add_compile_options(-Wno-stringop-overflow) # taken in by QVector's moving of elements when it optimises
+endif()
 add_link_options(-Wl,--as-needed)
 if(NOT ECM_ENABLE_SANITIZERS) # sanitized libraries find the runtime in the executable
     add_link_options(-Wl,--no-undefined)
+endif()
+
+set(HMI_TEST_ENVIRONMENT "")
+if(ECM_ENABLE_SANITIZERS MATCHES "address")
+    list(APPEND HMI_TEST_ENVIRONMENT
+        "LSAN_OPTIONS=suppressions=${PROJECT_SOURCE_DIR}/tests/support/lsan.supp:print_suppressions=0")
 endif()

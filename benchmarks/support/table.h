@@ -1,0 +1,31 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <algorithm>
+#include <cstdio>
+#include <vector>
+
+/// Rows of a benchmark: what an operation costs, what it could cost at best, and how far apart the two may be.
+namespace Table {
+
+inline double median(std::vector<double> values)
+{
+    std::sort(values.begin(), values.end());
+    return values.at(values.size() / 2);
+}
+
+inline void header()
+{
+    std::printf("%-58s %12s %12s %7s  %s\n", "operation", "ours", "limit", "ratio", "aim");
+}
+
+/// \a ours and \a limit in microseconds.
+inline void row(const char* operation, double ours, double limit, double aim)
+{
+    const double ratio = ours / limit;
+    std::printf("%-58s %9.1f us %9.1f us %7.2f  <= %.2f%s\n", operation, ours, limit, ratio, aim,
+                ratio <= aim ? "" : "  MISSED");
+    std::fflush(stdout);
+}
+
+} // namespace Table
