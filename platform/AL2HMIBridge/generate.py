@@ -188,7 +188,7 @@ def header(table, source):
     return "\n".join(out + ["};", "", "} // namespace AL2HMIBridge", ""])
 
 
-def value_spec(table, source, item):
+def value_shape(table, source, item):
     enum = table.enum_of(source, item["type"])
     low, high = limits(item)
     known = "{}"
@@ -211,7 +211,7 @@ def info_body(table, source, owner):
     for event in source.get("events", []):
         if event.get("args"):
             out.append(f"    static const Argument {event['name']}Arguments[] = {{")
-            out += [f"        {{{latin1(a['name'])}, {value_spec(table, source, a)}}}," for a in event["args"]]
+            out += [f"        {{{latin1(a['name'])}, {value_shape(table, source, a)}}}," for a in event["args"]]
             out.append("    };")
     if source.get("events"):
         out.append("    static const Event events[] = {")
@@ -222,7 +222,7 @@ def info_body(table, source, owner):
     if source.get("state"):
         out.append("    static const Field fields[] = {")
         for field in source["state"]:
-            out += [f"        {{{latin1(field['name'])}, {value_spec(table, source, field)},",
+            out += [f"        {{{latin1(field['name'])}, {value_shape(table, source, field)},",
                     f"         [] {{ return Value({stored_default(field)}); }},",
                     f"         &store<&{owner}::m_{field['name']}>, &notify<&{owner}::{field['name']}Changed>}},"]
         out.append("    };")
@@ -269,7 +269,7 @@ def sources_cpp(table):
                 out.append(f"[[maybe_unused]] constexpr int known{enum['name']}[] = {{{values}}};")
     for record in table.records.values():
         out.append(f"const Argument fields{record['name']}[] = {{")
-        out += [f"    {{{latin1(field['name'])}, {value_spec(table, {'name': ''}, field)}}}," for field in record["fields"]]
+        out += [f"    {{{latin1(field['name'])}, {value_shape(table, {'name': ''}, field)}}}," for field in record["fields"]]
         out += ["};", f"const Record record{record['name']} = {{{latin1(record['name'])},"
                 f" {{fields{record['name']}, {len(record['fields'])}}}}};"]
     languages = table.enum_of(table.by_name["GlobalSource"], "SystemLanguage")["values"]

@@ -57,7 +57,7 @@ QString decodeState(const QJsonObject& line, Message* message)
         if (!field)
             return QStringLiteral(".%1: no such state").arg(shown(name));
         message->fields.push_back({field, Value()});
-        const QString problem = decodeValue(it.value(), field->spec, &message->fields.back().value);
+        const QString problem = decodeValue(it.value(), field->shape, &message->fields.back().value);
         if (!problem.isEmpty())
             return QStringLiteral(".%1: %2").arg(name, problem);
     }
@@ -71,7 +71,7 @@ QString decodeArguments(const QJsonArray& values, const Event& event, Message* m
     message->arguments.resize(size_t(values.size()));
     for (int i = 0; i < event.arguments.count; ++i) {
         const Argument& argument = event.arguments.first[i];
-        const QString problem = decodeValue(values.at(i), argument.spec, &message->arguments[size_t(i)]);
+        const QString problem = decodeValue(values.at(i), argument.shape, &message->arguments[size_t(i)]);
         if (!problem.isEmpty())
             return QStringLiteral(".%1, %2: %3").arg(event.name, argument.name, problem);
     }

@@ -31,7 +31,7 @@ template<class T> struct Rows
 
 struct Record;
 
-struct ValueSpec
+struct ValueShape
 {
     ValueType type;
     double minimum; ///< of a number; 0 for texts and lists
@@ -43,7 +43,7 @@ struct ValueSpec
 struct Argument
 {
     QLatin1String name;
-    ValueSpec spec;
+    ValueShape shape;
 };
 
 struct Record
@@ -55,7 +55,7 @@ struct Record
 struct Field
 {
     QLatin1String name;
-    ValueSpec spec;
+    ValueShape shape;
     Value (*initial)();
     bool (*store)(QObject* source, Value& value); ///< true when the value differs from the one before
     void (*notify)(QObject* source);

@@ -15,50 +15,50 @@ namespace AL2HMIBridge {
 
 namespace {
 
-QString decodeInt(const QJsonValue& json, const ValueSpec& spec, Value* value)
+QString decodeInt(const QJsonValue& json, const ValueShape& shape, Value* value)
 {
     const double number = json.toDouble(std::numeric_limits<double>::quiet_NaN());
     if (!json.isDouble() || std::trunc(number) != number)
         return QStringLiteral("not an integer");
-    if (number < spec.minimum || number > spec.maximum)
+    if (number < shape.minimum || number > shape.maximum)
         return QStringLiteral("%1 is out of range").arg(number, 0, 'g', 12);
     const int integer = int(number);
-    if (spec.known.count && std::find(spec.known.begin(), spec.known.end(), integer) == spec.known.end())
+    if (shape.known.count && std::find(shape.known.begin(), shape.known.end(), integer) == shape.known.end())
         return QStringLiteral("%1 is not in the enumeration").arg(integer);
     *value = integer;
     return QString();
 }
 
-QString decodeReal(const QJsonValue& json, const ValueSpec& spec, Value* value)
+QString decodeReal(const QJsonValue& json, const ValueShape& shape, Value* value)
 {
     const double number = json.toDouble(std::numeric_limits<double>::quiet_NaN());
     if (!json.isDouble() || !std::isfinite(number))
         return QStringLiteral("not a number");
-    if (number < spec.minimum || number > spec.maximum)
+    if (number < shape.minimum || number > shape.maximum)
         return QStringLiteral("%1 is out of range").arg(number, 0, 'g', 12);
     *value = number;
     return QString();
 }
 
-QString decodeText(const QJsonValue& json, const ValueSpec& spec, Value* value)
+QString decodeText(const QJsonValue& json, const ValueShape& shape, Value* value)
 {
     if (!json.isString())
         return QStringLiteral("not a text");
     QString text = json.toString();
-    if (text.size() > spec.maximum)
-        return QStringLiteral("longer than %1").arg(spec.maximum);
+    if (text.size() > shape.maximum)
+        return QStringLiteral("longer than %1").arg(shape.maximum);
     *value = std::move(text);
     return QString();
 }
 
-QString decodeIntList(const QJsonValue& json, const ValueSpec& spec, Value* value)
+QString decodeIntList(const QJsonValue& json, const ValueShape& shape, Value* value)
 {
     if (!json.isArray())
         return QStringLiteral("not an array");
     const QJsonArray array = json.toArray();
-    if (array.size() > spec.maximum)
-        return QStringLiteral("more than %1 entries").arg(spec.maximum);
-    const ValueSpec entry{ValueType::Int, std::numeric_limits<int>::min(), std::numeric_limits<int>::max(), {}, nullptr};
+    if (array.size() > shape.maximum)
+        return QStringLiteral("more than %1 entries").arg(shape.maximum);
+    const ValueShape entry{ValueType::Int, std::numeric_limits<int>::min(), std::numeric_limits<int>::max(), {}, nullptr};
     QList<int> list;
     list.reserve(array.size());
     for (const QJsonValue element : array) {
@@ -81,7 +81,7 @@ QString decodeRecord(const QJsonObject& object, const Record& record, QVariantMa
         if (found == object.constEnd())
             return QStringLiteral("%1 is missing").arg(field.name);
         Value value;
-        const QString problem = decodeValue(found.value(), field.spec, &value);
+        const QString problem = decodeValue(found.value(), field.shape, &value);
         if (!problem.isEmpty())
             return QStringLiteral("%1: %2").arg(field.name, problem);
         std::visit([&](auto& plain) { map->insert(field.name, QVariant::fromValue(std::move(plain))); }, value);
@@ -89,18 +89,18 @@ QString decodeRecord(const QJsonObject& object, const Record& record, QVariantMa
     return QString();
 }
 
-QString decodeRecords(const QJsonValue& json, const ValueSpec& spec, Value* value)
+QString decodeRecords(const QJsonValue& json, const ValueShape& shape, Value* value)
 {
     if (!json.isArray())
         return QStringLiteral("not an array");
     const QJsonArray array = json.toArray();
-    if (array.size() > spec.maximum)
-        return QStringLiteral("more than %1 entries").arg(spec.maximum);
+    if (array.size() > shape.maximum)
+        return QStringLiteral("more than %1 entries").arg(shape.maximum);
     QVariantList list;
     list.reserve(array.size());
     for (const QJsonValue entry : array) {
         QVariantMap map;
-        const QString problem = entry.isObject() ? decodeRecord(entry.toObject(), *spec.record, &map)
+        const QString problem = entry.isObject() ? decodeRecord(entry.toObject(), *shape.record, &map)
                                                  : QStringLiteral("not an object");
         if (!problem.isEmpty())
             return QStringLiteral("entry %1: %2").arg(list.size()).arg(problem);
@@ -112,24 +112,24 @@ QString decodeRecords(const QJsonValue& json, const ValueSpec& spec, Value* valu
 
 } // namespace
 
-QString decodeValue(const QJsonValue& json, const ValueSpec& spec, Value* value)
+QString decodeValue(const QJsonValue& json, const ValueShape& shape, Value* value)
 {
-    switch (spec.type) {
+    switch (shape.type) {
     case ValueType::Bool:
         if (!json.isBool())
             return QStringLiteral("not true or false");
         *value = json.toBool();
         return QString();
     case ValueType::Int:
-        return decodeInt(json, spec, value);
+        return decodeInt(json, shape, value);
     case ValueType::Real:
-        return decodeReal(json, spec, value);
+        return decodeReal(json, shape, value);
     case ValueType::Text:
-        return decodeText(json, spec, value);
+        return decodeText(json, shape, value);
     case ValueType::IntList:
-        return decodeIntList(json, spec, value);
+        return decodeIntList(json, shape, value);
     case ValueType::Records:
-        return decodeRecords(json, spec, value);
+        return decodeRecords(json, shape, value);
     }
     return QStringLiteral("of unknown type");
 }

@@ -113,6 +113,10 @@ private Q_SLOTS:
         bool timerRan = false;
         QObject context;
         connect(FMTunerSource::instance(), &FMTunerSource::frequencyChanged, &context, [&] {
+            QElapsedTimer work; // a screen that has something to do on every change
+            work.start();
+            while (work.nsecsElapsed() < 10000)
+                continue;
             if (++stateChanges != 10) // the flood is being delivered; a key comes now
                 return;
             QVERIFY(keys.send(keyLine(7)));
