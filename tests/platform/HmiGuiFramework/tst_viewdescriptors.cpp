@@ -2,6 +2,9 @@
 #include "guifixture.h"
 
 #include <QFile>
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QJsonObject>
 #include <QTemporaryDir>
 
 #include <sys/stat.h>
@@ -116,6 +119,52 @@ private Q_SLOTS:
         QCOMPARE(loader.views.guiDescriptor().views.keys(), QStringList{text("P.Good")});
         QVERIFY(loader.views.guiDescriptor().popups.isEmpty());
         QVERIFY(loader.views.transients().transients.isEmpty());
+    }
+
+    /// An entry with a value for every field that the schema knows.
+    static QJsonObject entryFromSchema(const QJsonObject& definition)
+    {
+        const QHash<QString, QJsonValue> byReference{{text("#/definitions/name"), text("X")}, {text("#/definitions/url"), text("A.qml")},
+                                                     {text("#/definitions/variations"), QJsonObject{{text("c"), text("B.qml")}}}};
+        QJsonObject entry;
+        const QJsonObject properties = definition.value(text("properties")).toObject();
+        for (auto property = properties.begin(); property != properties.end(); ++property) {
+            const QJsonObject type = property.value().toObject();
+            if (type.contains(text("$ref")))
+                entry.insert(property.key(), byReference.value(type.value(text("$ref")).toString()));
+            else if (type.contains(text("enum")))
+                entry.insert(property.key(), type.value(text("enum")).toArray().last());
+            else if (type.value(text("type")) == text("integer"))
+                entry.insert(property.key(), type.value(text("maximum")));
+            else
+                entry.insert(property.key(), true);
+        }
+        return entry;
+    }
+
+    void everyFieldOfTheSchemaIsUnderstood_data()
+    {
+        QTest::addColumn<QString>("section");
+        for (const char* const section : {"views", "popups", "transients", "components"})
+            QTest::newRow(section) << text(section);
+    }
+
+    void everyFieldOfTheSchemaIsUnderstood()
+    {
+        QFETCH(QString, section);
+        QFile file(QFINDTESTDATA("../../../docs/schemas/view-descriptor.schema.json"));
+        QVERIFY(file.open(QIODevice::ReadOnly));
+        const QJsonObject schema = QJsonDocument::fromJson(file.readAll()).object();
+        const QJsonObject definitions = schema.value(text("definitions")).toObject();
+        QVERIFY(schema.value(text("properties")).toObject().contains(section));
+        const QJsonObject entry = entryFromSchema(definitions.value(section.chopped(1)).toObject());
+        QVERIFY(entry.size() >= 2);
+        Loader loader;
+        const QString path = loader.write(QJsonDocument(QJsonObject{{text("version"), 1}, {section, QJsonArray{entry}}}).toJson());
+        loader.views.loadModule(path, text("P"), 0);
+        QCOMPARE(loader.warnings(), QStringList());
+        QCOMPARE(loader.views.guiDescriptor().views.size() + loader.views.guiDescriptor().popups.size()
+                     + loader.views.transients().transients.size() + loader.views.transients().components.size(), 1);
     }
 
     void anUnusableDescriptorGivesOneWarningAndLoadsNothing_data()
