@@ -101,6 +101,22 @@ private Q_SLOTS:
         QVERIFY2(m_received.contains("TEST C002 log error"), m_received.constData());
     }
 
+    void theDaemonsLevelBecomesTheCategorys()
+    {
+        QProcess process;
+        process.setProcessEnvironment(environment());
+        process.start(QCoreApplication::applicationFilePath(), {QStringLiteral("--wait-for-debug")});
+        QVERIFY(receives("[waiting]"));
+        QProcess control;
+        control.start(QStringLiteral("dlt-control"), {QStringLiteral("-p"), QString::number(port), QStringLiteral("-a"), QStringLiteral("WAIT"),
+                                                      QStringLiteral("-c"), QStringLiteral("C001"), QStringLiteral("-l"), QStringLiteral("5"),
+                                                      QStringLiteral("127.0.0.1")});
+        QVERIFY(control.waitForFinished(deadline));
+        QVERIFY(process.waitForFinished(deadline));
+        QCOMPARE(process.exitCode(), 0);
+        QVERIFY2(receives("[debug is on]"), m_received.constData());
+    }
+
     void aDaemonThatDiesDoesNotHoldAnybodyUp()
     {
         m_daemon.kill();
@@ -128,6 +144,15 @@ int main(int argc, char** argv)
         qCCritical(second, "two");
         qCDebug(second, "off");
         fputs(handler.dltActive() ? "dlt active\n" : "dlt inactive\n", stderr);
+        return 0;
+    }
+    if (application.arguments().contains(QStringLiteral("--wait-for-debug"))) {
+        const MessageHandler handler(QStringLiteral("WAIT"));
+        const HmiLoggingCategory category("test.level", 1);
+        qCWarning(category, "waiting");
+        if (!QTest::qWaitFor([&] { return category.isDebugEnabled(); }, deadline))
+            return 1;
+        qCDebug(category, "debug is on");
         return 0;
     }
     DltTest test;
