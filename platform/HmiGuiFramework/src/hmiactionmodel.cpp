@@ -22,7 +22,7 @@ void HmiActionModel::addChild(HmiAction* action)
     connect(action, &HmiAction::textChanged, this, [this, action] { actionChanged(action, TextRole); });
     connect(action, &HmiAction::iconChanged, this, [this, action] { actionChanged(action, IconRole); });
     connect(action, &HmiAction::enabledChanged, this, [this, action] { actionChanged(action, EnabledRole); });
-    connect(action, &QObject::destroyed, this, [this](QObject* gone) { removeAction(gone); });
+    connect(action, &QObject::destroyed, this, &HmiActionModel::removeDeleted);
     Q_EMIT countChanged();
 }
 
@@ -30,7 +30,7 @@ void HmiActionModel::sortActions()
 {
     beginResetModel();
     std::stable_sort(m_actions.begin(), m_actions.end(),
-                     [](const HmiAction* a, const HmiAction* b) { return a->order() < b->order(); });
+                     [](const QPointer<HmiAction>& a, const QPointer<HmiAction>& b) { return a->order() < b->order(); });
     endResetModel();
 }
 
@@ -44,6 +44,8 @@ QVariant HmiActionModel::data(const QModelIndex& index, int role) const
     if (!checkIndex(index, CheckIndexOption::IndexIsValid | CheckIndexOption::ParentIsInvalid))
         return QVariant();
     HmiAction* const action = m_actions.at(index.row());
+    if (!action)
+        return QVariant();
     switch (role) {
     case ActionRole:
         return QVariant::fromValue(action);
@@ -84,14 +86,11 @@ void HmiActionModel::actionChanged(HmiAction* action, int role)
     Q_EMIT dataChanged(changed, changed, roles);
 }
 
-void HmiActionModel::removeAction(const QObject* action)
+void HmiActionModel::removeDeleted()
 {
-    // Only the address is left of a destroyed action.
-    const auto found = std::find_if(m_actions.constBegin(), m_actions.constEnd(),
-                                    [action](const HmiAction* other) { return static_cast<const QObject*>(other) == action; });
-    if (found == m_actions.constEnd())
+    const int row = int(m_actions.indexOf(QPointer<HmiAction>()));
+    if (row < 0)
         return;
-    const int row = int(found - m_actions.constBegin());
     beginRemoveRows(QModelIndex(), row, row);
     m_actions.remove(row);
     endRemoveRows();

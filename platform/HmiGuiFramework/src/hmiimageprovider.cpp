@@ -48,7 +48,8 @@ QImage drawSvg(const QString& file, const QColor& color, const QSize& requestedS
     QPainter painter(&image);
     painter.setOpacity(color.alphaF());
     renderer.render(&painter);
-    return image;
+    painter.end();
+    return image.copy(); // without the paint engine, which an image keeps once it was painted on
 }
 
 QImage draw(const QString& file, const QColor& color, const QSize& requestedSize)

@@ -15,6 +15,7 @@
 
 #include <QQmlContext>
 #include <QQmlEngine>
+#include <QQuickWindow>
 
 using HmiStateMachine::HmiLayeredState;
 using HmiStateMachine::NamedState;
@@ -62,8 +63,12 @@ ViewManager::ViewManager(QQmlEngine* engine, TransitionManager* transitionManage
     connect(transitionManager, &TransitionManager::finished, this, &ViewManager::transitionFinished);
     connect(StateMachine::instance(), &StateMachine::stateEntered, this, &ViewManager::stateEntered);
     connect(StateMachine::instance(), &StateMachine::stateExited, this, &ViewManager::stateExited);
-    // While the application object still stands: items give back what they took from the window.
-    connect(engine, &QObject::destroyed, this, [this] { m_cache->engineDestroyed(); });
+    // While the application object still stands: items and window give back what they took from each other.
+    connect(engine, &QObject::destroyed, this, [this] {
+        m_cache->engineDestroyed();
+        if (QQuickWindow* const window = m_stage->window())
+            window->destroy();
+    });
     connect(AppSettings::instance(), &AppSettings::uiVariationChanged, this, &ViewManager::applyVariation);
     engine->rootContext()->setContextProperty(QStringLiteral("_viewManager"), this);
 }

@@ -5,6 +5,7 @@
 #include "hmiguiframework_export.h"
 
 #include <QAbstractListModel>
+#include <QPointer>
 #include <QVector>
 
 namespace HmiGuiFramework {
@@ -43,9 +44,9 @@ Q_SIGNALS:
 
 private:
     void actionChanged(HmiAction* action, int role);
-    void removeAction(const QObject* action);
+    void removeDeleted();
 
-    QVector<HmiAction*> m_actions;
+    QVector<QPointer<HmiAction>> m_actions; // null for an action that is just being deleted
 };
 
 } // namespace HmiGuiFramework
