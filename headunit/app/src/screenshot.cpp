@@ -4,7 +4,6 @@
 #include <AL2HMIBridge/BridgeConnection>
 #include <HmiGuiFramework/DataStore>
 #include <HmiGuiFramework/ViewManager>
-#include <HmiGuiFramework/WindowManager>
 #include <HmiStateMachine/StateMachine>
 
 #include <QCoreApplication>
@@ -19,7 +18,6 @@
 using AL2HMIBridge::BridgeConnection;
 using HmiGuiFramework::DataStore;
 using HmiGuiFramework::ViewManager;
-using HmiGuiFramework::WindowManager;
 using HmiStateMachine::StateMachine;
 
 namespace {

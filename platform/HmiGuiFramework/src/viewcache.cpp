@@ -49,7 +49,7 @@ QQuickItem* ViewCache::item(const QString& name, const QUrl& url, QString* error
         m_components.remove(url); // a repaired file gets another chance
         return nullptr;
     }
-    object.release();
+    static_cast<void>(object.release()); // the cache owns it from here
     QQmlEngine::setObjectOwnership(item, QQmlEngine::CppOwnership);
     item->setVisible(false);
     m_items.insert(name, item);
