@@ -20,12 +20,12 @@ namespace AL2HMIBridge {
 
 namespace {
 
-constexpr QLatin1String timeKey("t");
-constexpr QLatin1String channelKey("channel");
-constexpr QLatin1String directionKey("direction");
-constexpr QLatin1String lineKey("line");
-constexpr QLatin1String textKey("text");
-constexpr QLatin1String droppedKey("dropped");
+const QLatin1String timeKey("t");
+const QLatin1String channelKey("channel");
+const QLatin1String directionKey("direction");
+const QLatin1String lineKey("line");
+const QLatin1String textKey("text");
+const QLatin1String droppedKey("dropped");
 
 struct RecordedLine
 {

@@ -4,22 +4,18 @@
 #include "../../moduledomains.h"
 #include "soundfactory.h"
 
-#include <HmiCore/HmiManager>
 #include <HmiCore/HmiSubmoduleHost>
 #include <HmiCore/HmiSubmoduleProvider>
 #include <HmiGuiFramework/HmiAction>
 #include <HmiGuiFramework/RequestView>
 #include <HmiStateMachine/HmiLayeredState>
 
-#include <QCoreApplication>
 #include <QQmlContext>
 #include <QUrl>
 
-using HmiCore::HmiManager;
 using HmiCore::HmiSubmoduleHost;
 using HmiCore::HmiSubmoduleProvider;
 using HmiGuiFramework::HmiAction;
-using HmiGuiFramework::HmiActionModel;
 using HmiGuiFramework::RequestView;
 using HmiStateMachine::HmiLayeredState;
 using HmiStateMachine::HmiState;
