@@ -15,13 +15,13 @@ namespace {
 
 // What is said of a source's line begins with what separates it from the source's name.
 
-constexpr QLatin1String sourceKey("source");
-constexpr QLatin1String stateKey("state");
-constexpr QLatin1String eventKey("event");
-constexpr QLatin1String argumentsKey("args");
-constexpr QLatin1String protocolKey("protocol");
-constexpr QLatin1String peerKey("peer");
-constexpr QLatin1String snapshotKey("snapshot");
+const QLatin1String sourceKey("source");
+const QLatin1String stateKey("state");
+const QLatin1String eventKey("event");
+const QLatin1String argumentsKey("args");
+const QLatin1String protocolKey("protocol");
+const QLatin1String peerKey("peer");
+const QLatin1String snapshotKey("snapshot");
 
 QString decodeGreeting(const QJsonObject& line, Message* message)
 {
