@@ -85,7 +85,8 @@ int main(int argc, char** argv)
         if (modules == 3) {
             Table::row("start to first screen, 3 modules / bare window", whole, bare, 1.15);
         } else {
-            std::snprintf(operation, sizeof operation, "start to first screen, %d modules / bare window + dlopen", modules);
+            std::snprintf(operation, sizeof operation, "start to first screen, %d modules / bare window + dlopen",
+                          modules);
             Table::row(operation, whole, bare + byHand);
         }
         std::snprintf(operation, sizeof operation, "loading %d plugins / metadata, dlopen and instance", modules);

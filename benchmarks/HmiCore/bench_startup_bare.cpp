@@ -21,8 +21,8 @@ int main(int argc, char** argv)
     item->setParentItem(window.contentItem());
     item->setSize(QSizeF(window.size()));
     const long long start = app.arguments().at(1).toLongLong();
-    QObject::connect(&window, &QQuickWindow::frameSwapped, &window, [start] { StartClock::report(start); },
-                     Qt::DirectConnection);
+    QObject::connect(
+        &window, &QQuickWindow::frameSwapped, &window, [start] { StartClock::report(start); }, Qt::DirectConnection);
     window.show();
     return app.exec();
 }

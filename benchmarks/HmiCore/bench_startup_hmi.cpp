@@ -76,10 +76,11 @@ int main(int argc, char** argv)
     Initializer initializer;
     app.initialize(&initializer);
     auto* const window = qobject_cast<QQuickWindow*>(QGuiApplication::allWindows().value(0));
-    const auto* const views = HmiGuiFramework::DataStore::get<HmiGuiFramework::ViewManager>(QStringLiteral("ViewManager"));
+    const auto* const views =
+        HmiGuiFramework::DataStore::get<HmiGuiFramework::ViewManager>(QStringLiteral("ViewManager"));
     const long long start = app.arguments().at(1).toLongLong();
-    QObject::connect(window, &QQuickWindow::frameSwapped, window, [start] { StartClock::report(start); },
-                     Qt::DirectConnection);
+    QObject::connect(
+        window, &QQuickWindow::frameSwapped, window, [start] { StartClock::report(start); }, Qt::DirectConnection);
     // As in the bare program the window appears with its screen in it.
     QObject::connect(views, &HmiGuiFramework::ViewManager::currentViewChanged, HmiCore::HmiManager::instance(),
                      &HmiCore::HmiManager::showHmiUI);

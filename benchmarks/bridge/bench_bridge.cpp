@@ -46,7 +46,8 @@ public:
         for (int channel = 0; channel < 2; ++channel)
             if (::socketpair(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0, m_pairs[size_t(channel)].data()) != 0)
                 qFatal("no sockets");
-        BridgeEndpoint::setConnector([this](BridgeEndpoint::Channel channel) { return ::dup(m_pairs[size_t(channel)][0]); });
+        BridgeEndpoint::setConnector(
+            [this](BridgeEndpoint::Channel channel) { return ::dup(m_pairs[size_t(channel)][0]); });
         MessageReceiveThread::createInstance(&m_owner)->begin();
         MessageReceivePriorityQueueThread::createInstance(&m_owner)->begin();
         const QByteArray greeting("{\"protocol\":1,\"peer\":\"application-layer\"}\n");
@@ -113,7 +114,7 @@ void stateMessages(benchmark::State& state)
     QByteArray lines;
     for (int i = 1; i <= batch; ++i)
         lines += "{\"source\":\"FMTunerSource\",\"state\":{\"frequency\":\"" + QByteArray::number(i)
-            + "\",\"stationName\":\"Harbour FM\",\"signalStrength\":80}}\n";
+                 + "\",\"stationName\":\"Harbour FM\",\"signalStrength\":80}}\n";
     const QString last = QString::number(batch);
     const int socket = bridge().messages();
     for (auto _ : state) {

@@ -35,7 +35,8 @@ void HmiHostedSubmodule::createSubmodule(HmiSubmoduleHost* host)
         qCWarning(coreLog) << "Submodule creation skipped," << name << "already contains" << submoduleName();
         return;
     }
-    auto* const viewManager = HmiGuiFramework::DataStore::get<HmiGuiFramework::ViewManager>(QStringLiteral("ViewManager"));
+    auto* const viewManager =
+        HmiGuiFramework::DataStore::get<HmiGuiFramework::ViewManager>(QStringLiteral("ViewManager"));
     if (viewManager && !viewDescriptorFile().isEmpty())
         viewManager->loadModule(viewDescriptorFile(), moduleId(), host->hostDomain());
     create(host->submoduleHostState());

@@ -52,8 +52,8 @@ public:
     virtual void connectTransitions(const QList<QPair<HmiStateMachine::StateLevel, QAbstractTransition*>>& transitions);
 
     /// \brief Wires popup states, of the root hierarchy or of a module.
-    virtual void connectPopupStates(
-        const QList<QPair<HmiStateMachine::StateLevel, HmiStateMachine::PopupState*>>& popupStates) = 0;
+    virtual void
+    connectPopupStates(const QList<QPair<HmiStateMachine::StateLevel, HmiStateMachine::PopupState*>>& popupStates) = 0;
 
     /// \brief Before everything else. Called twice in a row: an override must bear that.
     virtual void preInit(HmiManager* manager);

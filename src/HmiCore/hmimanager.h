@@ -48,14 +48,16 @@ public:
     QString factoryDefaultHomeState() const; ///< name of the state that is home after a factory reset; empty until set
     void setFactoryDefaultHomeState(QString name);
 
-    HmiStateMachine::HmiState* modulesRootState() const; ///< parent of all modules' root states; null until set, not owned
+    HmiStateMachine::HmiState*
+    modulesRootState() const; ///< parent of all modules' root states; null until set, not owned
 
     /// \brief Sets the parent of all modules' root states, which must not be null; rootStateActivated() follows it.
     void setModulesRootState(HmiStateMachine::HmiState* state);
 
     HmiModuleRootModel* moduleModel() const; ///< the modules, not sorted; owned by the manager
 
-    QSortFilterProxyModel* sortedModulesModel() const; ///< the modules as the menu shows them; null until set, not owned
+    QSortFilterProxyModel*
+    sortedModulesModel() const; ///< the modules as the menu shows them; null until set, not owned
     void setSortedModulesModel(QSortFilterProxyModel* model);
 
 Q_SIGNALS:

@@ -76,7 +76,8 @@ public:
     virtual QList<QPair<HmiStateMachine::StateLevel, QAbstractTransition*>> moduleRootHierarchyTransitions() const;
 
     /// \brief Popups of this module that may come up anywhere; none unless overridden. Not owned by the caller.
-    virtual QList<QPair<HmiStateMachine::StateLevel, HmiStateMachine::PopupState*>> moduleRootHierarchyPopupStates() const;
+    virtual QList<QPair<HmiStateMachine::StateLevel, HmiStateMachine::PopupState*>>
+    moduleRootHierarchyPopupStates() const;
 
     /// \brief Registers the module's QML types; does nothing unless overridden.
     virtual void registerTypes();
@@ -89,9 +90,9 @@ public:
     /// \brief Publishes the module's objects to QML.
     virtual void setupRootContext(QQmlContext* rootContext) = 0;
 
-    ModuleType type() const { return m_type; }  ///< as given to the constructor
-    bool enabled() const { return m_enabled; }  ///< whether the module is shown in the module model; initially true
-    bool blocked() const { return m_blocked; }  ///< whether the menu shows the module as out of use; initially false
+    ModuleType type() const { return m_type; } ///< as given to the constructor
+    bool enabled() const { return m_enabled; } ///< whether the module is shown in the module model; initially true
+    bool blocked() const { return m_blocked; } ///< whether the menu shows the module as out of use; initially false
 
 public Q_SLOTS:
     /// \brief Shows the module in the module model or hides it. Emits only on a change.

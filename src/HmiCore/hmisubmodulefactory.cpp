@@ -23,7 +23,8 @@ void HmiSubmoduleFactory::createSubmodule(const TargetState& target)
         qCWarning(coreLog) << "Submodule creation skipped," << target.viewName << "already contains" << submoduleName();
         return;
     }
-    auto* const viewManager = HmiGuiFramework::DataStore::get<HmiGuiFramework::ViewManager>(QStringLiteral("ViewManager"));
+    auto* const viewManager =
+        HmiGuiFramework::DataStore::get<HmiGuiFramework::ViewManager>(QStringLiteral("ViewManager"));
     if (viewManager && !viewDescriptorFile().isEmpty())
         viewManager->loadModule(viewDescriptorFile(), target.viewName, target.domain);
     create(target);

@@ -30,9 +30,9 @@ public:
     HmiSubmoduleHost(HmiStateMachine::HmiState* hostState, int hostDomain, QObject* parent);
     ~HmiSubmoduleHost() override;
 
-    int hostDomain() const;                                              ///< as given to the constructor
-    HmiStateMachine::HmiState* submoduleHostState() const;               ///< as given to the constructor
-    HmiGuiFramework::HmiActionModel* submoduleEntryActionModel() const;  ///< the menu; owned by the host
+    int hostDomain() const;                                             ///< as given to the constructor
+    HmiStateMachine::HmiState* submoduleHostState() const;              ///< as given to the constructor
+    HmiGuiFramework::HmiActionModel* submoduleEntryActionModel() const; ///< the menu; owned by the host
 
     /// \brief Adds an entry to the menu, which does not own it.
     void addSubmoduleEntryAction(HmiGuiFramework::HmiAction* action);

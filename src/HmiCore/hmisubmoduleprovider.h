@@ -44,7 +44,8 @@ public:
     ///
     /// Its views are loaded under \a viewName and \a domain. True when it was built at once, false when its factory is
     /// not there yet and the request waits for it.
-    bool requestSubmodule(int submoduleDomain, HmiStateMachine::HmiLayeredState* state, const QString& viewName, int domain);
+    bool requestSubmodule(int submoduleDomain, HmiStateMachine::HmiLayeredState* state, const QString& viewName,
+                          int domain);
 
     /// \brief Sets the factory of a domain, in place of an earlier one, and serves the requests that wait for it.
     void registerSubmoduleFactory(int submoduleDomain, HmiSubmoduleFactory* factory);

@@ -34,8 +34,9 @@ int main(int argc, char** argv)
     QDir base(QCoreApplication::applicationDirPath());
     HmiCore::HmiApplication::moveToBaseDir(base);
     HmiGuiFramework::AppSettings::mainFolderPath = base.absolutePath() + QLatin1Char('/');
-    RecordingInitializer initializer(QStringLiteral("views/root.json"),
-                                     arguments.contains(QStringLiteral("rootViews")) ? QStringLiteral("ROOT") : QString());
+    RecordingInitializer initializer(QStringLiteral("views/root.json"), arguments.contains(QStringLiteral("rootViews"))
+                                                                            ? QStringLiteral("ROOT")
+                                                                            : QString());
     app.initialize(&initializer);
     qDebug().noquote() << "home" << HmiCore::HmiManager::instance()->factoryDefaultHomeState();
     if (!arguments.contains(QStringLiteral("run")))
@@ -45,7 +46,8 @@ int main(int argc, char** argv)
         HmiCore::HmiManager::instance(), &HmiCore::HmiManager::hmiThemeSync, &app,
         [] {
             const bool running = HmiStateMachine::StateMachine::instance()->isRunning();
-            const bool shown = QGuiApplication::allWindows().value(0) && QGuiApplication::allWindows().first()->isVisible();
+            const bool shown =
+                QGuiApplication::allWindows().value(0) && QGuiApplication::allWindows().first()->isVisible();
             qDebug("machine %s, window %s", running ? "running" : "stopped", shown ? "shown" : "hidden");
             QCoreApplication::quit();
         },

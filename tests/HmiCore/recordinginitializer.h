@@ -20,8 +20,7 @@ public:
     }
 
     void initializeSources() override { qDebug("initializeSources"); }
-    void connectTransitions(
-        const QList<QPair<HmiStateMachine::StateLevel, QAbstractTransition*>>& transitions) override
+    void connectTransitions(const QList<QPair<HmiStateMachine::StateLevel, QAbstractTransition*>>& transitions) override
     {
         qDebug() << "connectTransitions" << transitions.size();
         HmiInitializer::connectTransitions(transitions);

@@ -113,11 +113,11 @@ private Q_SLOTS:
         QStringList methods;
         for (int i = meta.methodOffset(); i < meta.methodCount(); ++i)
             methods.append(QString::fromLatin1(meta.method(i).methodSignature()));
-        QCOMPARE(methods,
-                 QStringList({QStringLiteral("hmiEntrySync()"), QStringLiteral("viewLoaded(QString,QString)"),
-                              QStringLiteral("popupLoaded(QString,QString)"), QStringLiteral("transientLoaded(QString,QString)"),
-                              QStringLiteral("passThroughViewTouched()"), QStringLiteral("themeChange()"),
-                              QStringLiteral("moduleRootStateActivated()"), QStringLiteral("showHmiUI()")}));
+        QCOMPARE(methods, QStringList({QStringLiteral("hmiEntrySync()"), QStringLiteral("viewLoaded(QString,QString)"),
+                                       QStringLiteral("popupLoaded(QString,QString)"),
+                                       QStringLiteral("transientLoaded(QString,QString)"),
+                                       QStringLiteral("passThroughViewTouched()"), QStringLiteral("themeChange()"),
+                                       QStringLiteral("moduleRootStateActivated()"), QStringLiteral("showHmiUI()")}));
         for (const char* const slot : {"themeChange()", "moduleRootStateActivated()", "showHmiUI()"})
             QCOMPARE(meta.method(meta.indexOfSlot(slot)).access(), QMetaMethod::Private);
         QCOMPARE(meta.propertyCount() - meta.propertyOffset(), 0);
@@ -186,7 +186,8 @@ private Q_SLOTS:
         QCOMPARE(exported("_transitionManager"), stored<TransitionManager>("TransitionManager"));
         QCOMPARE(exported("_statusBarController"), stored<StatusBarController>("StatusBarController"));
         QCOMPARE(exported("_hmiWindow"), window());
-        QVERIFY(engine()->importPathList().contains(QDir(mainFolder.path() + QStringLiteral("/imports")).canonicalPath()));
+        QVERIFY(
+            engine()->importPathList().contains(QDir(mainFolder.path() + QStringLiteral("/imports")).canonicalPath()));
         QVERIFY(engine()->imageProvider(HmiImageProvider::imageProviderName));
         QVERIFY(engine()->imageProvider(HmiFrameProvider::imageProviderName));
         QVERIFY(!engine()->globalObject().property(QStringLiteral("traceLogger")).isUndefined());
@@ -207,7 +208,8 @@ private Q_SLOTS:
         QStringList found = announcements();
         QCOMPARE(found.takeFirst(), QStringLiteral("entry"));
         const auto url = [this](const char* file) {
-            return QUrl::fromLocalFile(mainFolder.filePath(QStringLiteral("views/") + QString::fromLatin1(file))).toString();
+            return QUrl::fromLocalFile(mainFolder.filePath(QStringLiteral("views/") + QString::fromLatin1(file)))
+                .toString();
         };
         QCOMPARE(found.takeLast(), QStringLiteral("transient ROOT.Volume ") + url("Volume.qml"));
         QCOMPARE(found.takeLast(), QStringLiteral("popup ROOT.Call ") + url("Call.qml"));
@@ -244,8 +246,8 @@ private Q_SLOTS:
     void themeAndPaletteChangesClearTheImages()
     {
         QFETCH(bool, palette);
-        auto* const images
-            = static_cast<HmiImageProvider*>(engine()->imageProvider(HmiImageProvider::imageProviderName));
+        auto* const images =
+            static_cast<HmiImageProvider*>(engine()->imageProvider(HmiImageProvider::imageProviderName));
         QImage icon(4, 4, QImage::Format_ARGB32);
         icon.fill(Qt::red);
         QVERIFY(QDir(mainFolder.path()).mkpath(QStringLiteral("icons")));
@@ -281,8 +283,9 @@ private Q_SLOTS:
     {
         QSignalSpy touched(&app, &HmiApplication::passThroughViewTouched);
         QThread* deliveredIn = nullptr;
-        const auto connection = connect(&app, &HmiApplication::passThroughViewTouched, this,
-                                        [&] { deliveredIn = QThread::currentThread(); }, Qt::DirectConnection);
+        const auto connection = connect(
+            &app, &HmiApplication::passThroughViewTouched, this, [&] { deliveredIn = QThread::currentThread(); },
+            Qt::DirectConnection);
         QSignalSpy idle(window(), &HmiQQuickWindow::idle);
         window()->setIdleTimeout(1);
         QTRY_COMPARE(idle.count(), 1); // and not again without activity
@@ -363,7 +366,8 @@ private Q_SLOTS:
         QFETCH(QStringList, announced);
         QStringList activated;
         QObject context;
-        connect(&manager, &HmiManager::moduleRootStateActivated, &context, [&](const QString& name) { activated += name; });
+        connect(&manager, &HmiManager::moduleRootStateActivated, &context,
+                [&](const QString& name) { activated += name; });
         QSignalSpy blacklisted(&manager, &HmiManager::blacklistedModuleRootStateEntered);
         QVERIFY(enter(state.constData()));
         QCOMPARE(activated, announced);
@@ -406,7 +410,7 @@ bool HmiApplicationTest::enter(const char* state)
 {
     HmiStateMachine::NamedState* const wanted = StateMachine::instance()->findState(QString::fromLatin1(state));
     return wanted && (wanted->active() || StateMachine::instance()->requestState(wanted))
-        && QTest::qWaitFor([wanted] { return wanted->active(); });
+           && QTest::qWaitFor([wanted] { return wanted->active(); });
 }
 
 int main(int argc, char** argv)

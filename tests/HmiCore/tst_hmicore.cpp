@@ -15,10 +15,7 @@ class HmiCoreTest : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void theCategoryHasItsName()
-    {
-        QCOMPARE(hmicore().categoryName(), "kest.hmicore");
-    }
+    void theCategoryHasItsName() { QCOMPARE(hmicore().categoryName(), "kest.hmicore"); }
 
     void theCategoryIsOneAndTheSameInAllThreads()
     {

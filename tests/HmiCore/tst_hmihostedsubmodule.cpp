@@ -50,7 +50,8 @@ private Q_SLOTS:
         HmiSubmoduleHost host(&settings, 12, nullptr);
         FakeSubmodule sound(QStringLiteral("Sound"));
         sound.createSubmodule(&host);
-        QCOMPARE(sound.ownCalls, QStringList({QStringLiteral("Sound in SETTINGS.Root"), QStringLiteral("Sound entry action")}));
+        QCOMPARE(sound.ownCalls,
+                 QStringList({QStringLiteral("Sound in SETTINGS.Root"), QStringLiteral("Sound entry action")}));
         QCOMPARE(host.submoduleEntryActionModel()->rowCount(), 1);
         QCOMPARE(debugLines(), QStringList(QStringLiteral("\"Sound\" Created in \"SETTINGS.Root\"")));
     }
@@ -83,8 +84,8 @@ private Q_SLOTS:
         sound.createSubmodule(&host);
         debugLines();
         sound.createSubmodule(&sameState);
-        QCOMPARE(warnings(),
-                 QStringList(QStringLiteral("Submodule creation skipped, \"SETTINGS.Root\" already contains \"Sound\"")));
+        QCOMPARE(warnings(), QStringList(QStringLiteral(
+                                 "Submodule creation skipped, \"SETTINGS.Root\" already contains \"Sound\"")));
         QCOMPARE(sameState.submoduleEntryActionModel()->rowCount(), 0);
         QCOMPARE(debugLines(), QStringList());
         sound.createSubmodule(&otherState);

@@ -134,7 +134,10 @@ private Q_SLOTS:
         views->setInitialState(home);
     }
 
-    void init() { log.emplace(QStringLiteral("kest.hmicore.debug=true\nhmi.performance.debug=true\nhmi.trace.debug=true")); }
+    void init()
+    {
+        log.emplace(QStringLiteral("kest.hmicore.debug=true\nhmi.performance.debug=true\nhmi.trace.debug=true"));
+    }
     void cleanup() { log.reset(); }
 
     void hooksRunInTheirOrder()

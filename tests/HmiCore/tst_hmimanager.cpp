@@ -68,14 +68,14 @@ private Q_SLOTS:
         QStringList methods;
         for (int i = meta.methodOffset(); i < meta.methodCount(); ++i)
             methods.append(QString::fromLatin1(meta.method(i).methodSignature()));
-        QCOMPARE(methods,
-                 QStringList({QStringLiteral("hmiSuspend()"),
-                              QStringLiteral("moduleRootStateActivated(HmiStateMachine::Identifier)"),
-                              QStringLiteral("blacklistedModuleRootStateEntered()"), QStringLiteral("rootStateActivated()"),
-                              QStringLiteral("hmiThemeSync()"), QStringLiteral("hmiPaletteChange(QString)"),
-                              QStringLiteral("hmiRetranslated()"), QStringLiteral("showHmiUI()"),
-                              QStringLiteral("masterResetBegin()"), QStringLiteral("masterResetEnd()"),
-                              QStringLiteral("reportMasterReset()"), QStringLiteral("stateMachineStopped()")}));
+        QCOMPARE(methods, QStringList({QStringLiteral("hmiSuspend()"),
+                                       QStringLiteral("moduleRootStateActivated(HmiStateMachine::Identifier)"),
+                                       QStringLiteral("blacklistedModuleRootStateEntered()"),
+                                       QStringLiteral("rootStateActivated()"), QStringLiteral("hmiThemeSync()"),
+                                       QStringLiteral("hmiPaletteChange(QString)"), QStringLiteral("hmiRetranslated()"),
+                                       QStringLiteral("showHmiUI()"), QStringLiteral("masterResetBegin()"),
+                                       QStringLiteral("masterResetEnd()"), QStringLiteral("reportMasterReset()"),
+                                       QStringLiteral("stateMachineStopped()")}));
         QCOMPARE(meta.method(meta.indexOfSlot("reportMasterReset()")).access(), QMetaMethod::Public);
         QCOMPARE(meta.method(meta.indexOfSlot("stateMachineStopped()")).access(), QMetaMethod::Private);
         QCOMPARE(meta.propertyCount(), QObject::staticMetaObject.propertyCount());
@@ -163,8 +163,9 @@ private Q_SLOTS:
         QVERIFY(stopped.count() > 0 || stopped.wait());
         const QStringList lines = log->take(QStringLiteral("kest.hmicore"), QtWarningMsg);
         QCOMPARE(lines.size(), 1);
-        QCOMPARE(lines.first(), QStringLiteral("The state machine has stopped.\n State machine error: \"%1\"")
-                                    .arg(QString(machine->errorString()).replace(QLatin1Char('"'), QLatin1String("\\\""))));
+        QCOMPARE(lines.first(),
+                 QStringLiteral("The state machine has stopped.\n State machine error: \"%1\"")
+                     .arg(QString(machine->errorString()).replace(QLatin1Char('"'), QLatin1String("\\\""))));
         QVERIFY(!machine->errorString().isEmpty());
         log->take(QStringLiteral("default"), QtWarningMsg); // Qt's own line about the error
     }

@@ -110,7 +110,8 @@ private Q_SLOTS:
         QCOMPARE(proxy->data(phone, HmiModuleRootModel::ModuleDomain), QVariant(7));
         QVERIFY(!proxy->data(phone, 263).isValid());
         QVERIFY(!proxy->data(QModelIndex(), 256).isValid());
-        QCOMPARE(proxy->asked, QStringList({QStringLiteral("2:261:7"), QStringLiteral("2:263:7"), QStringLiteral("-1:256:0")}));
+        QCOMPARE(proxy->asked,
+                 QStringList({QStringLiteral("2:261:7"), QStringLiteral("2:263:7"), QStringLiteral("-1:256:0")}));
     }
 
     void theDomainOfAnIndexIsTheSources()

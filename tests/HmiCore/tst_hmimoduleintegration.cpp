@@ -60,8 +60,8 @@ private Q_SLOTS:
     void theParentOwnsIt()
     {
         QObject parent;
-        const FakeModule* const module
-            = new FakeModule(QStringLiteral("Child"), 0, 0, HmiModuleIntegration::RootModule, &parent);
+        const FakeModule* const module =
+            new FakeModule(QStringLiteral("Child"), 0, 0, HmiModuleIntegration::RootModule, &parent);
         QCOMPARE(module->parent(), &parent);
     }
 
@@ -106,8 +106,9 @@ private Q_SLOTS:
         QStringList names;
         for (int i = meta.propertyOffset(); i < meta.propertyCount(); ++i)
             names.append(QString::fromLatin1(meta.property(i).name()));
-        QCOMPARE(names.join(QLatin1Char(' ')),
-                 QStringLiteral("moduleName iconUrl modulePriority viewDescriptorFile rootStateIdentifier enabled blocked"));
+        QCOMPARE(
+            names.join(QLatin1Char(' ')),
+            QStringLiteral("moduleName iconUrl modulePriority viewDescriptorFile rootStateIdentifier enabled blocked"));
         QCOMPARE(meta.enumeratorCount() - meta.enumeratorOffset(), 0);
     }
 

@@ -203,7 +203,8 @@ private Q_SLOTS:
         QVERIFY(QMetaObject::invokeMethod(&model, "containsModule", Q_RETURN_ARG(bool, contained), Q_ARG(int, 7)));
         QVERIFY(!contained);
         const QMetaObject& meta = HmiModuleRootModel::staticMetaObject;
-        QCOMPARE(meta.method(meta.indexOfMethod("containsModule(int)")).parameterNames(), QList<QByteArray>({"domain"}));
+        QCOMPARE(meta.method(meta.indexOfMethod("containsModule(int)")).parameterNames(),
+                 QList<QByteArray>({"domain"}));
     }
 
     void findsTheIndexOfAShownModuleOnly()

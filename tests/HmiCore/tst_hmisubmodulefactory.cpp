@@ -78,8 +78,9 @@ private Q_SLOTS:
         factory.createSubmodule(otherName); // the state's name is what counts
         QCOMPARE(factory.built.size(), 3);
         QCOMPARE(warnings(),
-                 QStringList({QStringLiteral("Submodule creation skipped, \"Phone.Layer\" already contains \"Contacts\""),
-                              QStringLiteral("Submodule creation skipped, \"PHONE.Contacts\" already contains \"Contacts\"")}));
+                 QStringList(
+                     {QStringLiteral("Submodule creation skipped, \"Phone.Layer\" already contains \"Contacts\""),
+                      QStringLiteral("Submodule creation skipped, \"PHONE.Contacts\" already contains \"Contacts\"")}));
         QCOMPARE(debugLines(), QStringList());
     }
 

@@ -71,7 +71,8 @@ private Q_SLOTS:
         QQmlEngine engine;
         engine.rootContext()->setContextProperty(QStringLiteral("host"), &host);
         QQmlComponent component(&engine);
-        component.setData("import QtQml 2.0\nQtObject { property int entries: host.submoduleEntryActionModel.count }", QUrl());
+        component.setData("import QtQml 2.0\nQtObject { property int entries: host.submoduleEntryActionModel.count }",
+                          QUrl());
         const std::unique_ptr<QObject> object(component.create());
         QVERIFY2(object, qPrintable(component.errorString()));
         QCOMPARE(object->property("entries").toInt(), 1);

@@ -35,8 +35,7 @@ class HmiSubmoduleProviderTest : public QObject
     }
     HmiSubmoduleHost* host(const char* stateName)
     {
-        auto* const made
-            = new HmiSubmoduleHost(new HmiState(QString::fromLatin1(stateName)), domain, &keeper);
+        auto* const made = new HmiSubmoduleHost(new HmiState(QString::fromLatin1(stateName)), domain, &keeper);
         made->submoduleHostState()->QObject::setParent(made);
         return made;
     }
@@ -138,8 +137,9 @@ private Q_SLOTS:
         provider->registerHostedSubmodule(domain, sound);
         if (!hostFirst)
             provider->registerSubmoduleHost(domain, settings);
-        QCOMPARE(sound->ownCalls, QStringList({QStringLiteral("Sound in SETTINGS"), QStringLiteral("Sound entry action"),
-                                               QStringLiteral("Sound transitions"), QStringLiteral("Sound popup states")}));
+        QCOMPARE(sound->ownCalls,
+                 QStringList({QStringLiteral("Sound in SETTINGS"), QStringLiteral("Sound entry action"),
+                              QStringLiteral("Sound transitions"), QStringLiteral("Sound popup states")}));
         QCOMPARE(settings->submoduleEntryActionModel()->rowCount(), 1);
         QCOMPARE(transitionCount(), transitionsBefore + 1);
         QCOMPARE(provider->rootHierarchyTransitions().last().first, HmiStateMachine::ViewLevel);
@@ -156,7 +156,8 @@ private Q_SLOTS:
             provider->registerHostedSubmodule(domain, submodule(name, &order));
         provider->registerSubmoduleHost(domain, host("SETTINGS"));
         QCOMPARE(order.filter(QStringLiteral(" in ")),
-                 QStringList({QStringLiteral("C in SETTINGS"), QStringLiteral("A in SETTINGS"), QStringLiteral("B in SETTINGS")}));
+                 QStringList({QStringLiteral("C in SETTINGS"), QStringLiteral("A in SETTINGS"),
+                              QStringLiteral("B in SETTINGS")}));
     }
 
     void aSubmoduleRegisteredTwiceIsBuiltOnceButListedAgain()
@@ -207,8 +208,10 @@ private Q_SLOTS:
         for (const HmiSubmoduleHost* const sorted : {settings, apps}) {
             const auto* const menu = sorted->submoduleEntryActionModel();
             const auto orderAt = [menu](int row) {
-                return menu->index(row).data(HmiGuiFramework::HmiActionModel::ActionRole)
-                    .value<HmiGuiFramework::HmiAction*>()->order();
+                return menu->index(row)
+                    .data(HmiGuiFramework::HmiActionModel::ActionRole)
+                    .value<HmiGuiFramework::HmiAction*>()
+                    ->order();
             };
             QCOMPARE(orderAt(0), 1);
             QCOMPARE(orderAt(1), 2);

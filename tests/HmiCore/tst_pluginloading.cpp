@@ -47,14 +47,22 @@ private Q_SLOTS:
     {
         QTest::addColumn<QString>("from");
         QTest::addColumn<QString>("to");
-        QTest::newRow("bin") << "/opt/hmi/bin" << "/opt/hmi";
-        QTest::newRow("bin in bin") << "/opt/bin/bin" << "/opt/bin";
-        QTest::newRow("base") << "/opt/hmi" << "/opt/hmi";
-        QTest::newRow("capital") << "/opt/hmi/Bin" << "/opt/hmi/Bin";
-        QTest::newRow("capitals") << "/opt/hmi/BIN" << "/opt/hmi/BIN";
-        QTest::newRow("longer name") << "/opt/hmi/bin2" << "/opt/hmi/bin2";
-        QTest::newRow("bin above") << "/opt/bin/hmi" << "/opt/bin/hmi";
-        QTest::newRow("root") << "/" << "/";
+        QTest::newRow("bin") << "/opt/hmi/bin"
+                             << "/opt/hmi";
+        QTest::newRow("bin in bin") << "/opt/bin/bin"
+                                    << "/opt/bin";
+        QTest::newRow("base") << "/opt/hmi"
+                              << "/opt/hmi";
+        QTest::newRow("capital") << "/opt/hmi/Bin"
+                                 << "/opt/hmi/Bin";
+        QTest::newRow("capitals") << "/opt/hmi/BIN"
+                                  << "/opt/hmi/BIN";
+        QTest::newRow("longer name") << "/opt/hmi/bin2"
+                                     << "/opt/hmi/bin2";
+        QTest::newRow("bin above") << "/opt/bin/hmi"
+                                   << "/opt/bin/hmi";
+        QTest::newRow("root") << "/"
+                              << "/";
     }
 
     void theBaseDirectoryIsAboveBin()
@@ -103,7 +111,8 @@ private Q_SLOTS:
             "D kest.hmicore: Framework imports path set.",
             "D kest.hmicore: Framework objects exported.",
         });
-        expected += QStringLiteral("D kest.hmicore: Looking for plugins in: \"%1\"").arg(layout.path(QStringLiteral("plugins")));
+        expected += QStringLiteral("D kest.hmicore: Looking for plugins in: \"%1\"")
+                        .arg(layout.path(QStringLiteral("plugins")));
         expected += texts({
             "D default: create Phone,10,1,9,hmi app",
             "D kest.hmicore: Loaded 1 plugins",
@@ -163,13 +172,15 @@ private Q_SLOTS:
         };
         row("engine", texts({"registerEngine pen app", "registerEngine keyboard app"}));
         row("refusing_engine",
-            texts({"registerEngine refused app", "\"refusing_engine.so\" failed to register input method engine \"refused\"",
+            texts({"registerEngine refused app",
+                   "\"refusing_engine.so\" failed to register input method engine \"refused\"",
                    "registerEngine pen app", "registerEngine refused too app",
                    "\"refusing_engine.so\" failed to register input method engine \"refused too\""}));
         row("engine_no_keys", {});
         row("engine_no_metadata",
             texts({"\"engine_no_metadata.so\"  is missing Hmi Input Method Engine Plugin metadata. Skipping"}));
-        row("engine_other_root", texts({"Could not obtain InputMethodEngineInterface pointer \"engine_other_root.so\""}));
+        row("engine_other_root",
+            texts({"Could not obtain InputMethodEngineInterface pointer \"engine_other_root.so\""}));
         row("engine_unresolved", texts({"Failed to load plugin \"engine_unresolved.so\""}));
         row("radio", texts({"\"radio.so\"  is not an Hmi Input Method Engine Plugin. Skipping"}));
         row("truncated", texts({"\"truncated.so\"  is not an Hmi Input Method Engine Plugin. Skipping"}));
@@ -200,8 +211,8 @@ private Q_SLOTS:
         QCOMPARE(files.size(), 3);
         for (const QString& file : files)
             expected += file == QStringLiteral("phone.so")
-                ? QStringLiteral("create Phone,10,1,9,hmi app")
-                : QStringLiteral("\"%1\"  is not an Hmi Module Plugin. Skipping").arg(file);
+                            ? QStringLiteral("create Phone,10,1,9,hmi app")
+                            : QStringLiteral("\"%1\"  is not an Hmi Module Plugin. Skipping").arg(file);
         QCOMPARE(loadingLines(layout), expected + QStringList(loaded.arg(1)));
     }
 
@@ -241,17 +252,28 @@ private Q_SLOTS:
         QTest::addColumn<QString>("conf");
         QTest::addColumn<QString>("names");
         QTest::newRow("no file") << QString() << "Phone Radio Traffic";
-        QTest::newRow("empty file") << "\n" << "Phone Radio Traffic";
-        QTest::newRow("other group") << "[Local]\nblacklist=phone\n" << "Phone Radio Traffic";
-        QTest::newRow("no group") << "blacklist=phone\n" << "Phone Radio Traffic";
-        QTest::newRow("blacklist") << "[Global]\nblacklist=phone\n" << "Radio Traffic";
-        QTest::newRow("blacklist of two") << "[Global]\nblacklist=phone, radio\n" << "";
-        QTest::newRow("both lists") << "[Global]\nwhitelist=phone\nblacklist=phone, radio\n" << "Phone";
-        QTest::newRow("white list restricts nothing") << "[Global]\nwhitelist=phone\n" << "Phone Radio Traffic";
-        QTest::newRow("other case") << "[Global]\nblacklist=Phone\n" << "Phone Radio Traffic";
-        QTest::newRow("part of a name") << "[Global]\nblacklist=phon, adio, phone2\n" << "Phone Radio Traffic";
-        QTest::newRow("file name") << "[Global]\nblacklist=phone.so\n" << "Phone Radio Traffic";
-        QTest::newRow("not INI") << "\x7f\x01{ blacklist: phone }" << "Phone Radio Traffic";
+        QTest::newRow("empty file") << "\n"
+                                    << "Phone Radio Traffic";
+        QTest::newRow("other group") << "[Local]\nblacklist=phone\n"
+                                     << "Phone Radio Traffic";
+        QTest::newRow("no group") << "blacklist=phone\n"
+                                  << "Phone Radio Traffic";
+        QTest::newRow("blacklist") << "[Global]\nblacklist=phone\n"
+                                   << "Radio Traffic";
+        QTest::newRow("blacklist of two") << "[Global]\nblacklist=phone, radio\n"
+                                          << "";
+        QTest::newRow("both lists") << "[Global]\nwhitelist=phone\nblacklist=phone, radio\n"
+                                    << "Phone";
+        QTest::newRow("white list restricts nothing") << "[Global]\nwhitelist=phone\n"
+                                                      << "Phone Radio Traffic";
+        QTest::newRow("other case") << "[Global]\nblacklist=Phone\n"
+                                    << "Phone Radio Traffic";
+        QTest::newRow("part of a name") << "[Global]\nblacklist=phon, adio, phone2\n"
+                                        << "Phone Radio Traffic";
+        QTest::newRow("file name") << "[Global]\nblacklist=phone.so\n"
+                                   << "Phone Radio Traffic";
+        QTest::newRow("not INI") << "\x7f\x01{ blacklist: phone }"
+                                 << "Phone Radio Traffic";
     }
 
     void listsChooseModulePlugins()
@@ -308,12 +330,24 @@ private Q_SLOTS:
         QTest::addColumn<QString>("programDirectory");
         QTest::addColumn<QString>("pluginDirectory"); // where the plugins are
         QTest::addColumn<QString>("searched");        // where they are looked for
-        QTest::newRow("in bin") << "bin" << "plugins" << "plugins";
-        QTest::newRow("in the base") << "." << "plugins" << "plugins";
-        QTest::newRow("in Bin") << "Bin" << "Bin/plugins" << "Bin/plugins";
-        QTest::newRow("in another directory") << "usr" << "usr/plugins" << "usr/plugins";
-        QTest::newRow("no plugins directory") << "bin" << "." << ".";
-        QTest::newRow("no plugins directory below Bin") << "Bin" << "Bin" << "Bin";
+        QTest::newRow("in bin") << "bin"
+                                << "plugins"
+                                << "plugins";
+        QTest::newRow("in the base") << "."
+                                     << "plugins"
+                                     << "plugins";
+        QTest::newRow("in Bin") << "Bin"
+                                << "Bin/plugins"
+                                << "Bin/plugins";
+        QTest::newRow("in another directory") << "usr"
+                                              << "usr/plugins"
+                                              << "usr/plugins";
+        QTest::newRow("no plugins directory") << "bin"
+                                              << "."
+                                              << ".";
+        QTest::newRow("no plugins directory below Bin") << "Bin"
+                                                        << "Bin"
+                                                        << "Bin";
     }
 
     void directoriesAreFoundFromTheProgram()
@@ -329,7 +363,8 @@ private Q_SLOTS:
                  QStringLiteral("Looking for plugins in: \"%1\"").arg(QDir::cleanPath(layout.path(searched))));
         QVERIFY(lines.contains(QStringLiteral("create Phone,10,1,9,hmi app")));
         QVERIFY(lines.contains(loaded.arg(1)));
-        QVERIFY(!lines.join(QLatin1Char('\n')).contains(QStringLiteral("Input Method"))); // a missing directory is not told
+        QVERIFY(
+            !lines.join(QLatin1Char('\n')).contains(QStringLiteral("Input Method"))); // a missing directory is not told
     }
 
     void settingsAndInputMethodsLieInTheBaseToo()
@@ -349,7 +384,8 @@ private Q_SLOTS:
         QTest::addColumn<QStringList>("plugins");
         QTest::addColumn<QString>("home");
         QTest::addColumn<QStringList>("warnings");
-        const auto row = [](const char* name, const QStringList& plugins, const char* home, const QStringList& warnings) {
+        const auto row = [](const char* name, const QStringList& plugins, const char* home,
+                            const QStringList& warnings) {
             QTest::newRow(name) << plugins << QString::fromLatin1(home) << warnings;
         };
         row("smallest of three", texts({"radio", "phone"}), "PHONE.Main", {});

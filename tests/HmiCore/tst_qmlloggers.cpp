@@ -46,18 +46,26 @@ private Q_SLOTS:
         QTest::addColumn<QString>("call");
         QTest::addColumn<QString>("category");
         QTest::addColumn<int>("type");
-        QTest::newRow("performance log") << "performanceLogger.log('m')" << "hmi.performance" << int(QtDebugMsg);
-        QTest::newRow("performance debug") << "performanceLogger.debug('m')" << "hmi.performance" << int(QtDebugMsg);
-        QTest::newRow("performance warn") << "performanceLogger.warn('m')" << "hmi.performance" << int(QtWarningMsg);
-        QTest::newRow("trace log") << "traceLogger.log('m')" << "hmi.trace" << int(QtDebugMsg);
-        QTest::newRow("trace debug") << "traceLogger.debug('m')" << "hmi.trace" << int(QtDebugMsg);
-        QTest::newRow("trace warn") << "traceLogger.warn('m')" << "hmi.trace" << int(QtWarningMsg);
-        QTest::newRow("of another logger")
-            << "performanceLogger.log.call(traceLogger, 'm')" << "hmi.trace" << int(QtDebugMsg);
-        QTest::newRow("taken off its logger") << "var f = traceLogger.warn; f('m')" << "hmi.trace" << int(QtWarningMsg);
-        QTest::newRow("called on something else")
-            << "performanceLogger.log.call({ sink: 1 }, 'm')" << "hmi.performance" << int(QtDebugMsg);
-        QTest::newRow("called on a number") << "traceLogger.log.call(3, 'm')" << "hmi.trace" << int(QtDebugMsg);
+        QTest::newRow("performance log") << "performanceLogger.log('m')"
+                                         << "hmi.performance" << int(QtDebugMsg);
+        QTest::newRow("performance debug") << "performanceLogger.debug('m')"
+                                           << "hmi.performance" << int(QtDebugMsg);
+        QTest::newRow("performance warn") << "performanceLogger.warn('m')"
+                                          << "hmi.performance" << int(QtWarningMsg);
+        QTest::newRow("trace log") << "traceLogger.log('m')"
+                                   << "hmi.trace" << int(QtDebugMsg);
+        QTest::newRow("trace debug") << "traceLogger.debug('m')"
+                                     << "hmi.trace" << int(QtDebugMsg);
+        QTest::newRow("trace warn") << "traceLogger.warn('m')"
+                                    << "hmi.trace" << int(QtWarningMsg);
+        QTest::newRow("of another logger") << "performanceLogger.log.call(traceLogger, 'm')"
+                                           << "hmi.trace" << int(QtDebugMsg);
+        QTest::newRow("taken off its logger") << "var f = traceLogger.warn; f('m')"
+                                              << "hmi.trace" << int(QtWarningMsg);
+        QTest::newRow("called on something else") << "performanceLogger.log.call({ sink: 1 }, 'm')"
+                                                  << "hmi.performance" << int(QtDebugMsg);
+        QTest::newRow("called on a number") << "traceLogger.log.call(3, 'm')"
+                                            << "hmi.trace" << int(QtDebugMsg);
     }
 
     void methodsWriteToTheirCategoryAndLevel()
@@ -75,37 +83,59 @@ private Q_SLOTS:
     {
         QTest::addColumn<QString>("arguments");
         QTest::addColumn<QString>("message");
-        QTest::newRow("none") << "" << "";
-        QTest::newRow("one") << "'a'" << "a";
-        QTest::newRow("mixed") << "'a', 1, [2, 3]" << "a 1 [2,3]";
-        QTest::newRow("empty text keeps its blanks") << "'', 'a', ''" << " a ";
-        QTest::newRow("numbers") << "1.5, -0, NaN, 1e21" << "1.5 0 NaN 1e+21";
-        QTest::newRow("nothing") << "undefined, null, true" << "undefined null true";
-        QTest::newRow("empty array") << "[]" << "[]";
-        QTest::newRow("nested array") << "[1, [2, 3], []]" << "[1,2,3,]";
-        QTest::newRow("nothing in an array") << "[null, undefined, 1]" << "[,,1]";
-        QTest::newRow("array with holes") << "[1, , 3]" << "[1,,3]";
-        QTest::newRow("array that is derived") << "new (class extends Array {})(1, 2)" << "[1,2]";
-        QTest::newRow("object") << "{}, ({ toString: function() { return 'own' } })" << "[object Object] own";
-        QTest::newRow("symbol") << "Symbol('s')" << "Symbol(s)";
-        QTest::newRow("percent sign") << "'100 %s %n'" << "100 %s %n";
+        QTest::newRow("none") << ""
+                              << "";
+        QTest::newRow("one") << "'a'"
+                             << "a";
+        QTest::newRow("mixed") << "'a', 1, [2, 3]"
+                               << "a 1 [2,3]";
+        QTest::newRow("empty text keeps its blanks") << "'', 'a', ''"
+                                                     << " a ";
+        QTest::newRow("numbers") << "1.5, -0, NaN, 1e21"
+                                 << "1.5 0 NaN 1e+21";
+        QTest::newRow("nothing") << "undefined, null, true"
+                                 << "undefined null true";
+        QTest::newRow("empty array") << "[]"
+                                     << "[]";
+        QTest::newRow("nested array") << "[1, [2, 3], []]"
+                                      << "[1,2,3,]";
+        QTest::newRow("nothing in an array") << "[null, undefined, 1]"
+                                             << "[,,1]";
+        QTest::newRow("array with holes") << "[1, , 3]"
+                                          << "[1,,3]";
+        QTest::newRow("array that is derived") << "new (class extends Array {})(1, 2)"
+                                               << "[1,2]";
+        QTest::newRow("object") << "{}, ({ toString: function() { return 'own' } })"
+                                << "[object Object] own";
+        QTest::newRow("symbol") << "Symbol('s')"
+                                << "Symbol(s)";
+        QTest::newRow("percent sign") << "'100 %s %n'"
+                                      << "100 %s %n";
         QTest::newRow("not ASCII") << "'Gr\u00fc\u00dfe'" << QStringLiteral(u"Gr\u00fc\u00dfe");
-        QTest::newRow("text that throws") << "{ toString: function() { throw 'thrown' } }, 'next'" << "thrown next";
+        QTest::newRow("text that throws") << "{ toString: function() { throw 'thrown' } }, 'next'"
+                                          << "thrown next";
         QTest::newRow("text that throws what throws")
-            << "{ toString: function() { throw { toString: function() { throw 1 } } } }, 'next'" << " next";
-        QTest::newRow("text that throws in an array")
-            << "[1, { toString: function() { throw 'thrown' } }, 3]" << "[1,thrown,3]";
-        QTest::newRow("getter that throws") << "Object.defineProperty([1, 2], 0, { get: function() { throw 'thrown' } })"
-                                            << "[thrown,2]";
-        QTest::newRow("no way to make text") << "Object.create(null), 'next'" << "TypeError: Type error next";
-        QTest::newRow("array in itself") << "(function() { var a = [1]; a.push(a, 2); return a })()" << "[1,,2]";
-        QTest::newRow("arrays in each other")
-            << "(function() { var a = [1], b = [2, a]; a.push(b); return a })()" << "[1,2,]";
-        QTest::newRow("array twice, not in itself") << "(function() { var a = [1]; return [a, a] })()" << "[1,1]";
+            << "{ toString: function() { throw { toString: function() { throw 1 } } } }, 'next'"
+            << " next";
+        QTest::newRow("text that throws in an array") << "[1, { toString: function() { throw 'thrown' } }, 3]"
+                                                      << "[1,thrown,3]";
+        QTest::newRow("getter that throws")
+            << "Object.defineProperty([1, 2], 0, { get: function() { throw 'thrown' } })"
+            << "[thrown,2]";
+        QTest::newRow("no way to make text") << "Object.create(null), 'next'"
+                                             << "TypeError: Type error next";
+        QTest::newRow("array in itself") << "(function() { var a = [1]; a.push(a, 2); return a })()"
+                                         << "[1,,2]";
+        QTest::newRow("arrays in each other") << "(function() { var a = [1], b = [2, a]; a.push(b); return a })()"
+                                              << "[1,2,]";
+        QTest::newRow("array twice, not in itself") << "(function() { var a = [1]; return [a, a] })()"
+                                                    << "[1,1]";
         QTest::newRow("deep array")
-            << "(function() { var a = ['deep']; for (var i = 0; i < 100000; ++i) a = [a]; return a })()" << "[]";
+            << "(function() { var a = ['deep']; for (var i = 0; i < 100000; ++i) a = [a]; return a })()"
+            << "[]";
         QTest::newRow("not quite so deep array")
-            << "(function() { var a = ['deep']; for (var i = 0; i < 63; ++i) a = [a]; return a })()" << "[deep]";
+            << "(function() { var a = ['deep']; for (var i = 0; i < 63; ++i) a = [a]; return a })()"
+            << "[deep]";
     }
 
     void argumentsBecomeTheMessage()
@@ -120,9 +150,12 @@ private Q_SLOTS:
     {
         QTest::addColumn<QString>("rules");
         QTest::addColumn<QString>("call");
-        QTest::newRow("debug") << "hmi.trace.debug=false" << "traceLogger.debug(probe)";
-        QTest::newRow("log") << "hmi.trace.debug=false" << "traceLogger.log(probe)";
-        QTest::newRow("warning") << "hmi.performance.warning=false" << "performanceLogger.warn(probe)";
+        QTest::newRow("debug") << "hmi.trace.debug=false"
+                               << "traceLogger.debug(probe)";
+        QTest::newRow("log") << "hmi.trace.debug=false"
+                             << "traceLogger.log(probe)";
+        QTest::newRow("warning") << "hmi.performance.warning=false"
+                                 << "performanceLogger.warn(probe)";
     }
 
     void nothingIsWrittenWhenTheLevelIsOff()

@@ -13,10 +13,12 @@ private Q_SLOTS:
     {
         HeadUnitLayout layout;
         layout.addModules({QStringLiteral("radio")});
-        const QStringList stages{QStringLiteral("constructOnly"), QStringLiteral("initializeOnly"), QStringLiteral("run")};
+        const QStringList stages{QStringLiteral("constructOnly"), QStringLiteral("initializeOnly"),
+                                 QStringLiteral("run")};
         for (int cycle = 0; cycle < 200; ++cycle) {
             const QString stage = stages.at(cycle % stages.size());
-            QVERIFY2(layout.run({stage}), qPrintable(QStringLiteral("%1 %2: %3").arg(cycle).arg(stage, layout.error())));
+            QVERIFY2(layout.run({stage}),
+                     qPrintable(QStringLiteral("%1 %2: %3").arg(cycle).arg(stage, layout.error())));
         }
     }
 };

@@ -22,7 +22,8 @@ inline HmiGuiFramework::ViewManager* views()
 
 inline QQuickWindow* window()
 {
-    return HmiGuiFramework::DataStore::get<HmiGuiFramework::WindowManager>(QStringLiteral("WindowManager"))->hmiWindow();
+    return HmiGuiFramework::DataStore::get<HmiGuiFramework::WindowManager>(QStringLiteral("WindowManager"))
+        ->hmiWindow();
 }
 
 inline void visit(QQuickItem* item, const std::function<void(QQuickItem*)>& visitor)
@@ -81,8 +82,9 @@ inline QString pathOf(const QQuickItem* item)
 {
     QStringList parts;
     for (; item; item = item->parentItem())
-        parts.prepend(item->objectName().isEmpty() ? QString::fromLatin1(item->metaObject()->className()).section(QLatin1Char('_'), 0, 0)
-                                                   : item->objectName());
+        parts.prepend(item->objectName().isEmpty()
+                          ? QString::fromLatin1(item->metaObject()->className()).section(QLatin1Char('_'), 0, 0)
+                          : item->objectName());
     return parts.join(QLatin1Char('/'));
 }
 

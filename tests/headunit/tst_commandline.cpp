@@ -9,7 +9,8 @@ class CommandLineTest : public QObject
 
     static CommandLine parse(const QString& arguments)
     {
-        return CommandLine::parse(QStringList{QStringLiteral("headunit")} + arguments.split(QLatin1Char(' '), Qt::SkipEmptyParts));
+        return CommandLine::parse(QStringList{QStringLiteral("headunit")}
+                                  + arguments.split(QLatin1Char(' '), Qt::SkipEmptyParts));
     }
 
 private Q_SLOTS:
@@ -23,7 +24,8 @@ private Q_SLOTS:
 
     void allOptionsAreUnderstood()
     {
-        const CommandLine line = parse(QStringLiteral("--vehicle dir --shot f.png --view RADIO --size 800x480 --night --record r --list-views"));
+        const CommandLine line = parse(
+            QStringLiteral("--vehicle dir --shot f.png --view RADIO --size 800x480 --night --record r --list-views"));
         QCOMPARE(line.outcome, CommandLine::Run);
         QCOMPARE(line.vehicleDirectory, QStringLiteral("dir"));
         QCOMPARE(line.shotFile, QStringLiteral("f.png"));
@@ -49,8 +51,10 @@ private Q_SLOTS:
         QTest::newRow("positional") << QStringLiteral("radio") << QStringLiteral("Unexpected argument 'radio'.");
         QTest::newRow("size") << QStringLiteral("--size big") << QStringLiteral("'big' is not a size");
         QTest::newRow("size too small") << QStringLiteral("--size 10x10") << QStringLiteral("'10x10' is not a size");
-        QTest::newRow("size too large") << QStringLiteral("--size 99999x720") << QStringLiteral("'99999x720' is not a size");
-        QTest::newRow("size negative") << QStringLiteral("--size -800x480") << QStringLiteral("'-800x480' is not a size");
+        QTest::newRow("size too large") << QStringLiteral("--size 99999x720")
+                                        << QStringLiteral("'99999x720' is not a size");
+        QTest::newRow("size negative") << QStringLiteral("--size -800x480")
+                                       << QStringLiteral("'-800x480' is not a size");
     }
 
     void mistakesAreNamed()

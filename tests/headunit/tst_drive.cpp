@@ -39,7 +39,10 @@ class DriveTest : public QObject
 {
     Q_OBJECT
 
-    static bool open(const char* view) { return Screen::views()->requestView(QString::fromLatin1(view)) && Screen::shows(view); }
+    static bool open(const char* view)
+    {
+        return Screen::views()->requestView(QString::fromLatin1(view)) && Screen::shows(view);
+    }
 
     static bool isSynchronised()
     {
@@ -114,8 +117,11 @@ private Q_SLOTS:
 
     void theNightComesFromTheVehicle()
     {
-        vehicle().run([](Vehicle& model) { model.setState(QStringLiteral("GlobalSource"), QStringLiteral("nightMode"), true); });
-        QTRY_COMPARE(HmiGuiFramework::DataStore::get<QObject>(QStringLiteral("UiThemeManager"))->property("palette").toString(), QStringLiteral("night"));
+        vehicle().run(
+            [](Vehicle& model) { model.setState(QStringLiteral("GlobalSource"), QStringLiteral("nightMode"), true); });
+        QTRY_COMPARE(
+            HmiGuiFramework::DataStore::get<QObject>(QStringLiteral("UiThemeManager"))->property("palette").toString(),
+            QStringLiteral("night"));
     }
 
     void aRestartedVehicleBringsItsStateToTheScreen()

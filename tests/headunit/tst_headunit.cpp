@@ -21,11 +21,16 @@ class HeadUnitTest : public QObject
 
     static QVariantMap preset(int index, const char* name)
     {
-        return {{QStringLiteral("bank"), 1}, {QStringLiteral("index"), index}, {QStringLiteral("name"), QString::fromUtf8(name)},
+        return {{QStringLiteral("bank"), 1},
+                {QStringLiteral("index"), index},
+                {QStringLiteral("name"), QString::fromUtf8(name)},
                 {QStringLiteral("frequency"), QStringLiteral("98.3")}};
     }
 
-    static bool open(const char* view) { return Screen::views()->requestView(QString::fromLatin1(view)) && Screen::shows(view); }
+    static bool open(const char* view)
+    {
+        return Screen::views()->requestView(QString::fromLatin1(view)) && Screen::shows(view);
+    }
 
     static bool isActive(const char* state)
     {
@@ -62,7 +67,8 @@ private Q_SLOTS:
             if (item->objectName().startsWith(QLatin1String("tile")))
                 tiles.append(item->objectName());
         });
-        QCOMPARE(tiles, QStringList({QStringLiteral("tileRADIO"), QStringLiteral("tilePHONE"), QStringLiteral("tileSETTINGS")}));
+        QCOMPARE(tiles, QStringList({QStringLiteral("tileRADIO"), QStringLiteral("tilePHONE"),
+                                     QStringLiteral("tileSETTINGS")}));
         QVERIFY(Screen::find("tileRADIO")->property("isHome").toBool());
         QVERIFY(!Screen::find("tilePHONE")->property("isHome").toBool());
     }
@@ -74,7 +80,8 @@ private Q_SLOTS:
         QTest::addColumn<QString>("title");
         QTest::newRow("radio") << QByteArray("tileRADIO") << QByteArray("RADIO.Main") << QStringLiteral("Radio");
         QTest::newRow("phone") << QByteArray("tilePHONE") << QByteArray("PHONE.Main") << QStringLiteral("Phone");
-        QTest::newRow("settings") << QByteArray("tileSETTINGS") << QByteArray("SETTINGS.Main") << QStringLiteral("Settings");
+        QTest::newRow("settings") << QByteArray("tileSETTINGS") << QByteArray("SETTINGS.Main")
+                                  << QStringLiteral("Settings");
     }
 
     void aTileOpensItsModule()
@@ -104,8 +111,11 @@ private Q_SLOTS:
     void theRadioShowsWhatTheTunerSays()
     {
         BridgeTester::setState("GlobalSource", {{"mainAudioSource", 1}});
-        BridgeTester::setState("FMTunerSource", {{"frequency", QStringLiteral("98.3")}, {"frequencyUnit", QStringLiteral("MHz")},
-                                                 {"stationName", QStringLiteral("Harbour FM")}, {"activePreset", 2}, {"activePresetBank", 1},
+        BridgeTester::setState("FMTunerSource", {{"frequency", QStringLiteral("98.3")},
+                                                 {"frequencyUnit", QStringLiteral("MHz")},
+                                                 {"stationName", QStringLiteral("Harbour FM")},
+                                                 {"activePreset", 2},
+                                                 {"activePresetBank", 1},
                                                  {"presets", QVariantList{preset(1, "One"), preset(2, "Two")}}});
         QCOMPARE(Screen::text("nowPlayingTitle"), QStringLiteral("Harbour FM"));
         QVERIFY(open("RADIO.Main"));
@@ -126,7 +136,8 @@ private Q_SLOTS:
         QVERIFY(Screen::tap("seekUp"));
         QVERIFY(Screen::tap("seekDown"));
         QVERIFY(Screen::tap("preset3"));
-        QCOMPARE(BridgeTester::takeCalls(), QStringList({QStringLiteral("GlobalSource.sendShortSeekUp()"), QStringLiteral("GlobalSource.sendShortSeekDown()"),
+        QCOMPARE(BridgeTester::takeCalls(), QStringList({QStringLiteral("GlobalSource.sendShortSeekUp()"),
+                                                         QStringLiteral("GlobalSource.sendShortSeekDown()"),
                                                          QStringLiteral("FMTunerSource.recallPreset(1, 3)")}));
     }
 
@@ -169,7 +180,9 @@ private Q_SLOTS:
     void anIncomingCallIsShownOverWhateverIsOnTheScreen()
     {
         QVERIFY(open("RADIO.Main"));
-        BridgeTester::setState("PhoneSource", {{"incomingCall", true}, {"callerName", QStringLiteral("Ada Martin")}, {"callerNumber", QStringLiteral("123")}});
+        BridgeTester::setState("PhoneSource", {{"incomingCall", true},
+                                               {"callerName", QStringLiteral("Ada Martin")},
+                                               {"callerNumber", QStringLiteral("123")}});
         QTRY_COMPARE(Screen::views()->currentPopup(), QStringLiteral("PHONE.IncomingCall"));
         QVERIFY(isActive("RADIO.Main"));
         QTRY_VERIFY(isActive("PHONE.IncomingCall"));
@@ -214,7 +227,8 @@ private Q_SLOTS:
 
     void nightAndDayFollowTheLightOutsideUntilTheDriverChooses()
     {
-        auto* const theme = HmiGuiFramework::DataStore::get<HmiGuiFramework::UiThemeManager>(QStringLiteral("UiThemeManager"));
+        auto* const theme =
+            HmiGuiFramework::DataStore::get<HmiGuiFramework::UiThemeManager>(QStringLiteral("UiThemeManager"));
         QCOMPARE(theme->palette(), QStringLiteral("day"));
         BridgeTester::setState("GlobalSource", {{"nightMode", true}});
         QCOMPARE(theme->palette(), QStringLiteral("night"));

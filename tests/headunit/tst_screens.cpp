@@ -19,7 +19,9 @@ class ScreensTest : public QObject
 
     static void fillWithState()
     {
-        const auto record = [](std::initializer_list<std::pair<QString, QVariant>> fields) { return QVariant(QVariantMap(fields)); };
+        const auto record = [](std::initializer_list<std::pair<QString, QVariant>> fields) {
+            return QVariant(QVariantMap(fields));
+        };
         QVariantList stations;
         QVariantList presets;
         QVariantList contacts;
@@ -27,16 +29,30 @@ class ScreensTest : public QObject
             const QString name = QStringLiteral("Station %1").arg(i);
             const QString frequency = QString::number(88 + i) + QStringLiteral(".3");
             stations.append(record({{QStringLiteral("name"), name}, {QStringLiteral("frequency"), frequency}}));
-            contacts.append(record({{QStringLiteral("name"), QStringLiteral("Person %1").arg(i)}, {QStringLiteral("number"), QStringLiteral("+49 30 555%1").arg(i)}}));
+            contacts.append(record({{QStringLiteral("name"), QStringLiteral("Person %1").arg(i)},
+                                    {QStringLiteral("number"), QStringLiteral("+49 30 555%1").arg(i)}}));
             if (i <= 6)
-                presets.append(record({{QStringLiteral("bank"), 1}, {QStringLiteral("index"), i}, {QStringLiteral("name"), name}, {QStringLiteral("frequency"), frequency}}));
+                presets.append(record({{QStringLiteral("bank"), 1},
+                                       {QStringLiteral("index"), i},
+                                       {QStringLiteral("name"), name},
+                                       {QStringLiteral("frequency"), frequency}}));
         }
-        QVERIFY(BridgeTester::setState("GlobalSource", {{"mainAudioSource", 1}, {"clockText", QStringLiteral("14:05")}, {"volume", 20}}));
-        QVERIFY(BridgeTester::setState("FMTunerSource", {{"frequency", QStringLiteral("107.9")}, {"frequencyUnit", QStringLiteral("MHz")},
-                                                         {"stationName", QStringLiteral("Station 12")}, {"stationList", stations}, {"presets", presets},
-                                                         {"activePreset", 2}, {"activePresetBank", 1}, {"trafficAnnouncementEnabled", true}}));
-        QVERIFY(BridgeTester::setState("PhoneSource", {{"deviceName", QStringLiteral("A phone")}, {"signalStrength", 3}, {"batteryLevel", 100},
-                                                       {"callerName", QStringLiteral("Person 1")}, {"callerNumber", QStringLiteral("+49 30 5551")}, {"contacts", contacts}}));
+        QVERIFY(BridgeTester::setState(
+            "GlobalSource", {{"mainAudioSource", 1}, {"clockText", QStringLiteral("14:05")}, {"volume", 20}}));
+        QVERIFY(BridgeTester::setState("FMTunerSource", {{"frequency", QStringLiteral("107.9")},
+                                                         {"frequencyUnit", QStringLiteral("MHz")},
+                                                         {"stationName", QStringLiteral("Station 12")},
+                                                         {"stationList", stations},
+                                                         {"presets", presets},
+                                                         {"activePreset", 2},
+                                                         {"activePresetBank", 1},
+                                                         {"trafficAnnouncementEnabled", true}}));
+        QVERIFY(BridgeTester::setState("PhoneSource", {{"deviceName", QStringLiteral("A phone")},
+                                                       {"signalStrength", 3},
+                                                       {"batteryLevel", 100},
+                                                       {"callerName", QStringLiteral("Person 1")},
+                                                       {"callerNumber", QStringLiteral("+49 30 5551")},
+                                                       {"contacts", contacts}}));
     }
 
     static QStringList cutOffTexts()
@@ -54,8 +70,10 @@ class ScreensTest : public QObject
         const double scale = qMin(Screen::window()->width() / 1280.0, Screen::window()->height() / 720.0);
         QStringList found;
         Screen::visit(Screen::views()->stage(), [&](QQuickItem* item) {
-            if (item->objectName() == QLatin1String("touchArea") && qMin(item->width(), item->height()) < smallestTarget * scale - 1)
-                found.append(QStringLiteral("%1: %2 x %3").arg(Screen::pathOf(item)).arg(item->width()).arg(item->height()));
+            if (item->objectName() == QLatin1String("touchArea")
+                && qMin(item->width(), item->height()) < smallestTarget * scale - 1)
+                found.append(
+                    QStringLiteral("%1: %2 x %3").arg(Screen::pathOf(item)).arg(item->width()).arg(item->height()));
         });
         return found;
     }
@@ -118,7 +136,9 @@ private Q_SLOTS:
         for (const QString& name : std::as_const(names))
             for (const QSize& size : {QSize(1280, 720), QSize(800, 480)})
                 for (const bool rightToLeft : {false, true})
-                    QTest::addRow("%s %dx%d %s", qPrintable(name), size.width(), size.height(), rightToLeft ? "rtl" : "ltr") << name << size << rightToLeft;
+                    QTest::addRow("%s %dx%d %s", qPrintable(name), size.width(), size.height(),
+                                  rightToLeft ? "rtl" : "ltr")
+                        << name << size << rightToLeft;
     }
 
     void everythingFits()

@@ -25,8 +25,8 @@ class ScreenshotTest : public QObject
         process.start(QCoreApplication::applicationDirPath() + QStringLiteral("/headunit"), arguments);
         if (!process.waitForFinished(60000))
             return {-1, QString(), QStringLiteral("did not end")};
-        return {process.exitStatus() == QProcess::NormalExit ? process.exitCode() : -2, QString::fromUtf8(process.readAllStandardOutput()),
-                QString::fromUtf8(process.readAllStandardError())};
+        return {process.exitStatus() == QProcess::NormalExit ? process.exitCode() : -2,
+                QString::fromUtf8(process.readAllStandardOutput()), QString::fromUtf8(process.readAllStandardError())};
     }
 
     static int colorsOf(const QImage& image)
@@ -68,8 +68,12 @@ private Q_SLOTS:
     {
         const QString day = m_folder.filePath(QStringLiteral("day.png"));
         const QString night = m_folder.filePath(QStringLiteral("night.png"));
-        QCOMPARE(headunit({QStringLiteral("--shot"), day, QStringLiteral("--size"), QStringLiteral("800x480")}).exitCode, 0);
-        QCOMPARE(headunit({QStringLiteral("--shot"), night, QStringLiteral("--size"), QStringLiteral("800x480"), QStringLiteral("--night")}).exitCode, 0);
+        QCOMPARE(
+            headunit({QStringLiteral("--shot"), day, QStringLiteral("--size"), QStringLiteral("800x480")}).exitCode, 0);
+        QCOMPARE(headunit({QStringLiteral("--shot"), night, QStringLiteral("--size"), QStringLiteral("800x480"),
+                           QStringLiteral("--night")})
+                     .exitCode,
+                 0);
         QCOMPARE(QImage(day).size(), QSize(800, 480));
         QVERIFY(qGray(QImage(day).pixel(797, 477)) > 200);
         QVERIFY(qGray(QImage(night).pixel(797, 477)) < 40);
@@ -79,15 +83,22 @@ private Q_SLOTS:
     {
         const QString first = m_folder.filePath(QStringLiteral("first.png"));
         const QString second = m_folder.filePath(QStringLiteral("second.png"));
-        QCOMPARE(headunit({QStringLiteral("--shot"), first, QStringLiteral("--view"), QStringLiteral("RADIO.Main")}).exitCode, 0);
-        QCOMPARE(headunit({QStringLiteral("--shot"), second, QStringLiteral("--view"), QStringLiteral("RADIO.Main")}).exitCode, 0);
+        QCOMPARE(headunit({QStringLiteral("--shot"), first, QStringLiteral("--view"), QStringLiteral("RADIO.Main")})
+                     .exitCode,
+                 0);
+        QCOMPARE(headunit({QStringLiteral("--shot"), second, QStringLiteral("--view"), QStringLiteral("RADIO.Main")})
+                     .exitCode,
+                 0);
         QCOMPARE(QImage(first), QImage(second));
     }
 
     void theTrafficIsRecordedFromTheFirstLineOn()
     {
         const QString recording = m_folder.filePath(QStringLiteral("recording.jsonl"));
-        QCOMPARE(headunit({QStringLiteral("--shot"), m_folder.filePath(QStringLiteral("x.png")), QStringLiteral("--record"), recording}).exitCode, 0);
+        QCOMPARE(headunit({QStringLiteral("--shot"), m_folder.filePath(QStringLiteral("x.png")),
+                           QStringLiteral("--record"), recording})
+                     .exitCode,
+                 0);
         QFile file(recording);
         QVERIFY(file.open(QIODevice::ReadOnly));
         const QByteArray lines = file.readAll();
@@ -100,13 +111,18 @@ private Q_SLOTS:
         QTest::addColumn<QStringList>("arguments");
         QTest::addColumn<int>("exitCode");
         QTest::addColumn<QString>("message");
-        QTest::newRow("unknown view") << QStringList({QStringLiteral("--shot"), QStringLiteral("x.png"), QStringLiteral("--view"), QStringLiteral("Nope")})
+        QTest::newRow("unknown view") << QStringList(
+            {QStringLiteral("--shot"), QStringLiteral("x.png"), QStringLiteral("--view"), QStringLiteral("Nope")})
                                       << 2 << QStringLiteral("there is no view 'Nope'; there are: PHONE.Call, ");
-        QTest::newRow("unknown option") << QStringList({QStringLiteral("--frobnicate")}) << 2 << QStringLiteral("frobnicate");
-        QTest::newRow("recording that cannot be written") << QStringList({QStringLiteral("--shot"), QStringLiteral("x.png"), QStringLiteral("--record"), QStringLiteral("/proc/nothing/r")})
-                                                          << 1 << QStringLiteral("/proc/nothing/r");
-        QTest::newRow("file that cannot be written") << QStringList({QStringLiteral("--shot"), QStringLiteral("/proc/nothing/x.png")})
-                                                     << 1 << QStringLiteral("'/proc/nothing/x.png' cannot be written");
+        QTest::newRow("unknown option") << QStringList({QStringLiteral("--frobnicate")}) << 2
+                                        << QStringLiteral("frobnicate");
+        QTest::newRow("recording that cannot be written")
+            << QStringList({QStringLiteral("--shot"), QStringLiteral("x.png"), QStringLiteral("--record"),
+                            QStringLiteral("/proc/nothing/r")})
+            << 1 << QStringLiteral("/proc/nothing/r");
+        QTest::newRow("file that cannot be written")
+            << QStringList({QStringLiteral("--shot"), QStringLiteral("/proc/nothing/x.png")}) << 1
+            << QStringLiteral("'/proc/nothing/x.png' cannot be written");
     }
 
     void mistakesEndWithAMessageAndTheirExitCode()

@@ -14,7 +14,9 @@ class ThemeTest : public QObject
 
     static double luminance(const QColor& color)
     {
-        const auto linear = [](double part) { return part <= 0.03928 ? part / 12.92 : std::pow((part + 0.055) / 1.055, 2.4); };
+        const auto linear = [](double part) {
+            return part <= 0.03928 ? part / 12.92 : std::pow((part + 0.055) / 1.055, 2.4);
+        };
         return 0.2126 * linear(color.redF()) + 0.7152 * linear(color.greenF()) + 0.0722 * linear(color.blueF());
     }
 
@@ -62,7 +64,8 @@ private Q_SLOTS:
         QCOMPARE(palettes.keys(), QStringList({QStringLiteral("day"), QStringLiteral("night")}));
         for (const QString& name : palettes.keys()) {
             const QJsonObject colors = palettes.value(name).toObject();
-            const double ratio = contrast(QColor(colors.value(text).toString()), QColor(colors.value(ground).toString()));
+            const double ratio =
+                contrast(QColor(colors.value(text).toString()), QColor(colors.value(ground).toString()));
             QVERIFY2(ratio >= 4.5, qPrintable(QStringLiteral("%1: %2").arg(name).arg(ratio)));
         }
     }

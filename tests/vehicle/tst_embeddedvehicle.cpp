@@ -41,7 +41,7 @@ private:
     {
         const BridgeConnection* const connection = BridgeConnection::instance();
         return connection->synchronised() && connection->channelConnected(BridgeEndpoint::Priority)
-            && connection->channelConnected(BridgeEndpoint::Touch);
+               && connection->channelConnected(BridgeEndpoint::Touch);
     }
 
 private Q_SLOTS:
@@ -140,7 +140,11 @@ private Q_SLOTS:
     void startAndStopLeaveNoDescriptorBehind()
     {
         m_owner.reset();
-        const auto count = [] { return QDir(QStringLiteral("/proc/self/fd")).entryList(QDir::NoDotAndDotDot | QDir::AllEntries | QDir::System).size(); };
+        const auto count = [] {
+            return QDir(QStringLiteral("/proc/self/fd"))
+                .entryList(QDir::NoDotAndDotDot | QDir::AllEntries | QDir::System)
+                .size();
+        };
         m_vehicle->stop();
         const auto before = count();
         for (int i = 0; i < 50; ++i) {

@@ -26,10 +26,13 @@ private:
         Vehicle::Options options;
         options.frozen = frozen;
         m_sent.clear();
-        m_vehicle = std::make_unique<Vehicle>(options, [this](Channel channel, const QByteArray& line) { m_sent.append({channel, line}); });
+        m_vehicle = std::make_unique<Vehicle>(options, [this](Channel channel, const QByteArray& line) {
+            m_sent.append({channel, line});
+        });
     }
 
-    QString call(const char* source, const char* name, const QJsonArray& arguments = {}, Channel channel = Channel::Messages)
+    QString call(const char* source, const char* name, const QJsonArray& arguments = {},
+                 Channel channel = Channel::Messages)
     {
         const QJsonObject line{{QStringLiteral("source"), QString::fromLatin1(source)},
                                {QStringLiteral("call"), QString::fromLatin1(name)},
@@ -107,18 +110,25 @@ private Q_SLOTS:
     {
         QTest::addColumn<QByteArray>("line");
         QTest::addColumn<QString>("problem");
-        const auto row = [](const char* line, const char* problem) { QTest::newRow(line) << QByteArray(line) << QString::fromLatin1(problem); };
+        const auto row = [](const char* line, const char* problem) {
+            QTest::newRow(line) << QByteArray(line) << QString::fromLatin1(problem);
+        };
         row("garbage", "not a call");
         row("[]", "not a call");
         row("{\"source\":\"GlobalSource\",\"call\":\"setVolume\"}", "not a call");
         row("{\"source\":\"GlobalSource\",\"call\":\"setVolume\",\"args\":1}", "not a call");
-        row("{\"source\":\"GlobalSource\",\"call\":\"setVolume\",\"args\":[1,2]}", "GlobalSource.setVolume: 2 arguments instead of 1");
-        row("{\"source\":\"GlobalSource\",\"call\":\"setVolume\",\"args\":[\"1\"]}", "GlobalSource.setVolume: argument 1 is of another type");
-        row("{\"source\":\"GlobalSource\",\"call\":\"setVolume\",\"args\":[1.5]}", "GlobalSource.setVolume: argument 1 is of another type");
-        row("{\"source\":\"GlobalSource\",\"call\":\"setVolume\",\"args\":[1e300]}", "GlobalSource.setVolume: argument 1 is of another type");
+        row("{\"source\":\"GlobalSource\",\"call\":\"setVolume\",\"args\":[1,2]}",
+            "GlobalSource.setVolume: 2 arguments instead of 1");
+        row("{\"source\":\"GlobalSource\",\"call\":\"setVolume\",\"args\":[\"1\"]}",
+            "GlobalSource.setVolume: argument 1 is of another type");
+        row("{\"source\":\"GlobalSource\",\"call\":\"setVolume\",\"args\":[1.5]}",
+            "GlobalSource.setVolume: argument 1 is of another type");
+        row("{\"source\":\"GlobalSource\",\"call\":\"setVolume\",\"args\":[1e300]}",
+            "GlobalSource.setVolume: argument 1 is of another type");
         row("{\"source\":\"GlobalSource\",\"call\":\"explode\",\"args\":[]}", "GlobalSource.explode: no such call");
         row("{\"source\":\"TunerSource\",\"call\":\"tune\",\"args\":[\"\",\"\"]}", "TunerSource.tune: no such source");
-        row("{\"source\":\"TouchInput\",\"call\":\"setPassThroughViewVisible\",\"args\":[true]}", "TouchInput has no calls on messages");
+        row("{\"source\":\"TouchInput\",\"call\":\"setPassThroughViewVisible\",\"args\":[true]}",
+            "TouchInput has no calls on messages");
     }
 
     void badCallsAreRefused()
@@ -215,7 +225,12 @@ private Q_SLOTS:
         call("FMTunerSource", "tune", {QStringLiteral("96.1"), QString()});
         call("GlobalSource", "sendShortPresetKey", {1});
         QCOMPARE(textOf("FMTunerSource", "stationName"), QStringLiteral("Radio Karavane"));
-        QCOMPARE(value("FMTunerSource", "presets").toArray().first().toObject().value(QStringLiteral("frequency")).toString(),
+        QCOMPARE(value("FMTunerSource", "presets")
+                     .toArray()
+                     .first()
+                     .toObject()
+                     .value(QStringLiteral("frequency"))
+                     .toString(),
                  QStringLiteral("107.2"));
     }
 
@@ -436,7 +451,8 @@ private Q_SLOTS:
         m_vehicle->keyEvent(7, 0);
         QCOMPARE(m_sent.size(), 1);
         QVERIFY(m_sent.constFirst().first == Channel::Priority);
-        QCOMPARE(m_sent.constFirst().second, QByteArray("{\"args\":[7,0],\"event\":\"keyEvent\",\"source\":\"KeySource\"}\n"));
+        QCOMPARE(m_sent.constFirst().second,
+                 QByteArray("{\"args\":[7,0],\"event\":\"keyEvent\",\"source\":\"KeySource\"}\n"));
     }
 
     void switchesSetAnyStateThatThereIs()

@@ -57,23 +57,26 @@ private:
 
     static bool isCut(int socket)
     {
-        return QTest::qWaitFor([socket] {
-            pollfd descriptor{socket, POLLRDHUP, 0};
-            return ::poll(&descriptor, 1, 0) == 1;
-        }, 10000);
+        return QTest::qWaitFor(
+            [socket] {
+                pollfd descriptor{socket, POLLRDHUP, 0};
+                return ::poll(&descriptor, 1, 0) == 1;
+            },
+            10000);
     }
 
     int connectGreeted()
     {
         const int hmi = connectHmi();
-        return write(hmi, "{\"protocol\":1,\"peer\":\"hmi\"}\n") && !readUntil(hmi, "\"complete\"}\n").isEmpty() ? hmi : -1;
+        return write(hmi, "{\"protocol\":1,\"peer\":\"hmi\"}\n") && !readUntil(hmi, "\"complete\"}\n").isEmpty() ? hmi
+                                                                                                                 : -1;
     }
 
     bool works(int hmi)
     {
         QSignalSpy called(m_service.get(), &VehicleService::called);
         return write(hmi, "{\"source\":\"GlobalSource\",\"call\":\"requestBeepSound\",\"args\":[]}\n")
-            && QTest::qWaitFor([&] { return called.size() == 1; });
+               && QTest::qWaitFor([&] { return called.size() == 1; });
     }
 
 private Q_SLOTS:
@@ -120,7 +123,8 @@ private Q_SLOTS:
         const QString wrong = QStringLiteral("HMI on messages left: it does not greet as an HMI of protocol 1");
         QTest::newRow("version") << QByteArray("{\"protocol\":2,\"peer\":\"hmi\"}\n") << wrong;
         QTest::newRow("garbage") << QByteArray("hello\n") << wrong;
-        QTest::newRow("long line") << QByteArray(1024 * 1024, 'x') << QStringLiteral("HMI on messages left: its line is too long");
+        QTest::newRow("long line") << QByteArray(1024 * 1024, 'x')
+                                   << QStringLiteral("HMI on messages left: its line is too long");
         QTest::newRow("silence") << QByteArray() << QStringLiteral("HMI on messages left: it does not greet");
     }
 
@@ -188,7 +192,8 @@ private Q_SLOTS:
         {
             VehicleDirectory directory;
             QVERIFY2(directory.listen(path), qPrintable(directory.errorString()));
-            struct stat status{};
+            struct stat status
+            {};
             QCOMPARE(::stat(QFile::encodeName(path).constData(), &status), 0);
             QCOMPARE(status.st_mode & 0777, mode_t(0700));
             QCOMPARE(QDir(path).entryList(QDir::System | QDir::Files).size(), 3);

@@ -18,12 +18,13 @@ private:
     {
         process.start(program(), {QStringLiteral("--dir"), directory, QStringLiteral("--frozen")});
         return QTest::qWaitFor([&] { return process.canReadLine(); }, 20000)
-            && process.readLine() == "vehicle-sim serves " + directory.toLocal8Bit() + '\n';
+               && process.readLine() == "vehicle-sim serves " + directory.toLocal8Bit() + '\n';
     }
 
     static bool socketsExist(const QString& directory)
     {
-        return QDir(directory).entryList(QDir::System) == QStringList({QStringLiteral("messages"), QStringLiteral("priority"), QStringLiteral("touch")});
+        return QDir(directory).entryList(QDir::System)
+               == QStringList({QStringLiteral("messages"), QStringLiteral("priority"), QStringLiteral("touch")});
     }
 
 private Q_SLOTS:
@@ -56,7 +57,8 @@ private Q_SLOTS:
         third.start(program(), {QStringLiteral("--dir"), directory.path()});
         QVERIFY(third.waitForFinished());
         QCOMPARE(third.exitCode(), 1);
-        QCOMPARE(third.readAllStandardError(), "vehicle-sim: " + directory.path().toLocal8Bit() + ": another vehicle serves it\n");
+        QCOMPARE(third.readAllStandardError(),
+                 "vehicle-sim: " + directory.path().toLocal8Bit() + ": another vehicle serves it\n");
         QVERIFY(socketsExist(directory.path()));
         second.terminate();
         QVERIFY(second.waitForFinished());

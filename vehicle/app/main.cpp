@@ -31,7 +31,8 @@ int main(int argc, char** argv)
     QCoreApplication application(argc, argv);
     QCoreApplication::setApplicationName(QStringLiteral("vehicle-sim"));
     QCommandLineParser parser;
-    parser.setApplicationDescription(QStringLiteral("A simulated vehicle: the application layer that an HMI connects to."));
+    parser.setApplicationDescription(
+        QStringLiteral("A simulated vehicle: the application layer that an HMI connects to."));
     parser.addHelpOption();
     const QCommandLineOption directoryOption(QStringLiteral("dir"), QStringLiteral("Directory of the sockets."),
                                              QStringLiteral("directory"), HmiVehicle::VehicleDirectory::defaultPath());
@@ -40,7 +41,8 @@ int main(int argc, char** argv)
     parser.addOption(frozenOption);
     parser.process(application);
     if (!parser.positionalArguments().isEmpty()) {
-        QTextStream(stderr) << "vehicle-sim: unexpected argument: " << parser.positionalArguments().constFirst() << '\n';
+        QTextStream(stderr) << "vehicle-sim: unexpected argument: " << parser.positionalArguments().constFirst()
+                            << '\n';
         return 2;
     }
 
@@ -50,7 +52,8 @@ int main(int argc, char** argv)
         options.startTime = QTime::currentTime();
     HmiVehicle::VehicleService service(options);
     HmiVehicle::VehicleDirectory directory;
-    QObject::connect(&directory, &HmiVehicle::VehicleDirectory::connected, &service, &HmiVehicle::VehicleService::addConnection);
+    QObject::connect(&directory, &HmiVehicle::VehicleDirectory::connected, &service,
+                     &HmiVehicle::VehicleService::addConnection);
     if (!directory.listen(parser.value(directoryOption))) {
         QTextStream(stderr) << "vehicle-sim: " << directory.errorString() << '\n';
         return 1;

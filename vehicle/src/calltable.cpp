@@ -44,7 +44,8 @@ CallTable::CallTable()
     QFile file(QStringLiteral(":/HmiVehicle/sources.json"));
     if (!file.open(QIODevice::ReadOnly))
         qFatal("the table of sources is not in the program");
-    const QJsonArray sources = QJsonDocument::fromJson(file.readAll()).object().value(QLatin1String("sources")).toArray();
+    const QJsonArray sources =
+        QJsonDocument::fromJson(file.readAll()).object().value(QLatin1String("sources")).toArray();
     for (const QJsonValue value : sources) {
         const QJsonObject source = value.toObject();
         Entry entry = m_sources.value(source.value(QLatin1String("base")).toString());

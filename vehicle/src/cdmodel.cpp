@@ -17,7 +17,7 @@ struct Track
     int duration;
 };
 
-const Track tracks[] = {{"Overture", 312}, {"The Ferry", 247}, {"Salt and Pine", 268}, {"Interlude", 94},
+const Track tracks[] = {{"Overture", 312},       {"The Ferry", 247},     {"Salt and Pine", 268}, {"Interlude", 94},
                         {"Harbour Lights", 301}, {"A Letter Home", 226}, {"Low Tide", 355}};
 constexpr int trackCount = int(std::size(tracks));
 

@@ -98,8 +98,9 @@ int EmbeddedVehicle::connectChannel(const QString& name)
         return -1;
     VehicleService* const service = m_running->service;
     const auto offered = std::make_shared<OfferedSocket>(pair[0]);
-    QMetaObject::invokeMethod(service, [service, channel, offered] { service->addConnection(channel, offered->take()); },
-                              Qt::QueuedConnection);
+    QMetaObject::invokeMethod(
+        service, [service, channel, offered] { service->addConnection(channel, offered->take()); },
+        Qt::QueuedConnection);
     return pair[1];
 }
 
@@ -108,8 +109,8 @@ void EmbeddedVehicle::run(std::function<void(Vehicle&)> action)
     const std::lock_guard<std::mutex> lock(m_running->mutex);
     VehicleService* const service = m_running->service;
     if (service)
-        QMetaObject::invokeMethod(service, [service, action = std::move(action)] { action(service->vehicle()); },
-                                  Qt::QueuedConnection);
+        QMetaObject::invokeMethod(
+            service, [service, action = std::move(action)] { action(service->vehicle()); }, Qt::QueuedConnection);
 }
 
 } // namespace HmiVehicle

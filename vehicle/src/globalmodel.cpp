@@ -66,7 +66,8 @@ void GlobalModel::addKeyAnswers()
     for (const char* const call : {"sendLongReleasedSeekDown", "sendLongReleasedSeekUp", "sendLongReleasedTuneDownKey",
                                    "sendLongReleasedTuneUpKey"})
         on(call, [this] { player()->stopWinding(); });
-    on("sendShortPresetKey", [this](const QJsonArray& arguments) { player()->recallPresetKey(arguments.at(0).toInt()); });
+    on("sendShortPresetKey",
+       [this](const QJsonArray& arguments) { player()->recallPresetKey(arguments.at(0).toInt()); });
     on("sendLongPresetKey", [this](const QJsonArray& arguments) { player()->storePresetKey(arguments.at(0).toInt()); });
     on("sendShortReleasedVolumeUpKey", [this] { changeVolume(1); });
     on("sendShortReleasedVolumeDownKey", [this] { changeVolume(-1); });
@@ -85,8 +86,10 @@ void GlobalModel::addKeyAnswers()
 
 void GlobalModel::addSettingAnswers()
 {
-    on("setAudioSource", [this](const QJsonArray& arguments) { setAudioSource(arguments.at(0).toInt(), arguments.at(1).toInt()); });
-    on("setVolume", [this](const QJsonArray& arguments) { changeVolume(arguments.at(0).toInt() - value("volume").toInt()); });
+    on("setAudioSource",
+       [this](const QJsonArray& arguments) { setAudioSource(arguments.at(0).toInt(), arguments.at(1).toInt()); });
+    on("setVolume",
+       [this](const QJsonArray& arguments) { changeVolume(arguments.at(0).toInt() - value("volume").toInt()); });
     on("setMuted", [this](const QJsonArray& arguments) { set("muted", arguments.at(0).toBool()); });
     on("setSystemLanguage", [this](const QJsonArray& arguments) {
         if (value("supportedLanguages").toArray().contains(arguments.at(0)))
@@ -149,7 +152,8 @@ void GlobalModel::releaseKeys()
 
 void GlobalModel::showClock()
 {
-    set("clockText", m_startTime.addMSecs(int(scheduler().now() % (24 * 3600 * 1000))).toString(QStringLiteral("HH:mm")));
+    set("clockText",
+        m_startTime.addMSecs(int(scheduler().now() % (24 * 3600 * 1000))).toString(QStringLiteral("HH:mm")));
 }
 
 } // namespace HmiVehicle

@@ -17,7 +17,8 @@ class GlobalModel : public Model
 {
 public:
     /// \a players by the number of their audio source; everything given outlives this.
-    GlobalModel(Scheduler& scheduler, QTime startTime, std::map<int, AudioModel*> players, PhoneModel& phone, SpeechModel& speech);
+    GlobalModel(Scheduler& scheduler, QTime startTime, std::map<int, AudioModel*> players, PhoneModel& phone,
+                SpeechModel& speech);
 
     /// Nobody holds a key any more.
     void releaseKeys();

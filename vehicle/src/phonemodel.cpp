@@ -16,10 +16,12 @@ struct Contact
 
 // Invented people; the numbers are of ranges that nobody can have.
 const Contact contacts[] = {
-    {"Amélie Fontaine", "+33 1 99 00 12 34"}, {"Ben Okafor", "+44 20 7946 0018"},     {"Carla Moretti", "+39 055 000 0142"},
-    {"Dana Whitfield", "+1 555 0100"},        {"Garage Lindenau", "+49 30 23125 011"}, {"Home", "+1 555 0101"},
-    {"Jürgen Weiß", "+49 30 23125 042"},      {"Office", "+1 555 0123"},               {"Sofía Herrera", "+34 900 000 155"},
-    {"Tomáš Dvořák", "+420 000 000 167"},     {"Yuki Tanaka", "+81 3 0000 0188"},      {"王芳", "+86 10 0000 0199"},
+    {"Amélie Fontaine", "+33 1 99 00 12 34"}, {"Ben Okafor", "+44 20 7946 0018"},
+    {"Carla Moretti", "+39 055 000 0142"},    {"Dana Whitfield", "+1 555 0100"},
+    {"Garage Lindenau", "+49 30 23125 011"},  {"Home", "+1 555 0101"},
+    {"Jürgen Weiß", "+49 30 23125 042"},      {"Office", "+1 555 0123"},
+    {"Sofía Herrera", "+34 900 000 155"},     {"Tomáš Dvořák", "+420 000 000 167"},
+    {"Yuki Tanaka", "+81 3 0000 0188"},       {"王芳", "+86 10 0000 0199"},
 };
 
 } // namespace
@@ -27,7 +29,8 @@ const Contact contacts[] = {
 PhoneModel::PhoneModel(Scheduler& scheduler)
     : Model("PhoneSource", scheduler)
 {
-    for (const char* const field : {"incomingCall", "callConnected", "privateMode", "siriActive", "phoneVoiceServiceActive", "dialling"})
+    for (const char* const field :
+         {"incomingCall", "callConnected", "privateMode", "siriActive", "phoneVoiceServiceActive", "dialling"})
         set(field, false);
     set("siriSupported", true);
     set("siriEnabled", true);

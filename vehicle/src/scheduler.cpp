@@ -33,7 +33,8 @@ int Scheduler::add(int milliseconds, int period, Action action)
 void Scheduler::cancel(int* task)
 {
     const int id = std::exchange(*task, 0);
-    const auto found = std::find_if(m_tasks.begin(), m_tasks.end(), [id](const auto& entry) { return entry.second.id == id; });
+    const auto found =
+        std::find_if(m_tasks.begin(), m_tasks.end(), [id](const auto& entry) { return entry.second.id == id; });
     if (found != m_tasks.end())
         m_tasks.erase(found);
 }

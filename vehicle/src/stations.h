@@ -12,7 +12,7 @@ struct Station
     const char* frequency;
     const char* name; ///< UTF-8, as the texts
     const char* text;
-    int signal; ///< per cent
+    int signal;   ///< per cent
     bool traffic; ///< has traffic announcements
 };
 

@@ -45,7 +45,8 @@ void TunerModel::initialState()
     set("bandMaximum", m_band.maximum);
     QJsonArray list;
     for (const Station& station : m_band.stations)
-        list.append(QJsonObject{{QStringLiteral("frequency"), text(station.frequency)}, {QStringLiteral("name"), text(station.name)}});
+        list.append(QJsonObject{{QStringLiteral("frequency"), text(station.frequency)},
+                                {QStringLiteral("name"), text(station.name)}});
     set("stationList", list);
     publishPresets();
     recall(1);
@@ -59,7 +60,8 @@ void TunerModel::addAnswers()
         set("autoStoreInProgress", false);
     });
     on("cancelAnnouncement", [this] { endAnnouncement(); });
-    on("toggleTpSeekInProgress", [this](const QJsonArray& arguments) { setTrafficAnnouncements(arguments.at(1).toBool()); });
+    on("toggleTpSeekInProgress",
+       [this](const QJsonArray& arguments) { setTrafficAnnouncements(arguments.at(1).toBool()); });
     on("recallPreset", [this](const QJsonArray& arguments) { recallPresetKey(arguments.at(1).toInt()); });
     on("storePreset", [this](const QJsonArray& arguments) { storePresetKey(arguments.at(1).toInt()); });
     on("selectPresetBank", [this](const QJsonArray& arguments) { selectBank(arguments.at(0).toInt()); });
@@ -84,7 +86,8 @@ void TunerModel::tuneTo(const QString& frequency)
     const Station* const station = found == m_band.stations.end() ? nullptr : &*found;
     bool isNumber = false;
     const double number = frequency.toDouble(&isNumber);
-    const bool isInBand = isNumber && m_band.step > 0 && number >= m_band.minimum && number <= m_band.maximum; // not for NaN
+    const bool isInBand =
+        isNumber && m_band.step > 0 && number >= m_band.minimum && number <= m_band.maximum; // not for NaN
     if (!station && !isInBand)
         return;
     set("frequency", station ? frequency : QString::number(number, 'f', m_band.decimals));
@@ -209,8 +212,10 @@ void TunerModel::publishPresets()
         if (m_presets[size_t(i)] < 0)
             continue;
         const Station& station = m_band.stations[size_t(m_presets[size_t(i)])];
-        list.append(QJsonObject{{QStringLiteral("bank"), i / bankSize}, {QStringLiteral("index"), i % bankSize + 1},
-                                {QStringLiteral("name"), text(station.name)}, {QStringLiteral("frequency"), text(station.frequency)}});
+        list.append(QJsonObject{{QStringLiteral("bank"), i / bankSize},
+                                {QStringLiteral("index"), i % bankSize + 1},
+                                {QStringLiteral("name"), text(station.name)},
+                                {QStringLiteral("frequency"), text(station.frequency)}});
     }
     set("presets", list);
 }

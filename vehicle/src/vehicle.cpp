@@ -34,7 +34,8 @@ struct Vehicle::Models
         , diagnostics(scheduler)
         , keys(scheduler)
         , touch(scheduler)
-        , global(scheduler, options.startTime, {{0, &am}, {1, &fm}, {2, &xm}, {3, &dab}, {4, &cd}, {16, &media}}, phone, speech)
+        , global(scheduler, options.startTime, {{0, &am}, {1, &fm}, {2, &xm}, {3, &dab}, {4, &cd}, {16, &media}}, phone,
+                 speech)
     {
     }
 
@@ -54,8 +55,8 @@ struct Vehicle::Models
     KeyModel keys;
     TouchModel touch;
     GlobalModel global;
-    const std::vector<Model*> all{&global, &am, &fm, &xm, &dab, &cd, &media, &phone, &eaPhone, &speech, &projection,
-                                  &valet, &diagnostics, &keys, &touch};
+    const std::vector<Model*> all{&global,  &am,     &fm,         &xm,    &dab,         &cd,   &media, &phone,
+                                  &eaPhone, &speech, &projection, &valet, &diagnostics, &keys, &touch};
 };
 
 Vehicle::Vehicle(const Options& options, Output output)
@@ -116,7 +117,8 @@ void Vehicle::keyEvent(int keyId, int keyState)
 
 void Vehicle::keyComboEvent(int keyComboId, int keyState)
 {
-    m_output(Channel::Priority, eventLine(m_models->keys.source(), QStringLiteral("keyComboEvent"), {keyComboId, keyState}));
+    m_output(Channel::Priority,
+             eventLine(m_models->keys.source(), QStringLiteral("keyComboEvent"), {keyComboId, keyState}));
 }
 
 void Vehicle::touchBehindHmi()

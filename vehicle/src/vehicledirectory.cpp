@@ -77,7 +77,8 @@ bool VehicleDirectory::openDirectory(const QString& path)
     if (::mkdir(name.constData(), 0700) != 0 && errno != EEXIST)
         return fail(QString::fromLocal8Bit(std::strerror(errno)));
     m_directory = ::open(name.constData(), O_RDONLY | O_DIRECTORY | O_NOFOLLOW | O_CLOEXEC);
-    struct stat status{};
+    struct stat status
+    {};
     if (m_directory < 0 || ::fstat(m_directory, &status) != 0)
         return fail(QStringLiteral("not a directory that can be opened"));
     if (status.st_uid != ::geteuid() || (status.st_mode & (S_IRWXG | S_IRWXO)))
@@ -133,7 +134,8 @@ void VehicleDirectory::accept(const Listener& listener)
         return;
     }
     ::close(socket);
-    qCWarning(vehicleLog).noquote() << "HMI on" << channelName(listener.channel) << "refused: it is run by another user";
+    qCWarning(vehicleLog).noquote() << "HMI on" << channelName(listener.channel)
+                                    << "refused: it is run by another user";
 }
 
 } // namespace HmiVehicle

@@ -29,8 +29,9 @@ VehicleService::~VehicleService()
 
 void VehicleService::addConnection(Channel channel, int socket)
 {
-    const auto others = std::count_if(m_connections.cbegin(), m_connections.cend(),
-                                      [channel](const Connection* connection) { return connection->channel() == channel; });
+    const auto others =
+        std::count_if(m_connections.cbegin(), m_connections.cend(),
+                      [channel](const Connection* connection) { return connection->channel() == channel; });
     if (others >= maximumConnections) {
         ::close(socket);
         return;
@@ -41,7 +42,8 @@ void VehicleService::addConnection(Channel channel, int socket)
         if (connection->channel() == Channel::Messages)
             connection->send(m_vehicle.snapshot());
     });
-    connect(connection, &Connection::lineReceived, this, [this, connection](const QByteArray& line) { receive(connection, line); });
+    connect(connection, &Connection::lineReceived, this,
+            [this, connection](const QByteArray& line) { receive(connection, line); });
     connect(connection, &Connection::closed, this, [this, connection] { forget(connection); });
     connection->start();
 }
@@ -66,9 +68,8 @@ void VehicleService::receive(Connection* connection, const QByteArray& line)
 void VehicleService::forget(Connection* connection)
 {
     m_connections.removeOne(connection);
-    const bool someLeft = std::any_of(m_connections.cbegin(), m_connections.cend(), [](const Connection* other) {
-        return other->channel() == Channel::Messages;
-    });
+    const bool someLeft = std::any_of(m_connections.cbegin(), m_connections.cend(),
+                                      [](const Connection* other) { return other->channel() == Channel::Messages; });
     if (!someLeft)
         m_vehicle.peerLost();
 }

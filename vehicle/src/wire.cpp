@@ -53,7 +53,8 @@ QByteArray stateLine(const QString& source, const QJsonObject& state)
 
 QByteArray eventLine(const QString& source, const QString& event, const QJsonArray& arguments)
 {
-    return encode({{QStringLiteral("source"), source}, {QStringLiteral("event"), event}, {QStringLiteral("args"), arguments}});
+    return encode(
+        {{QStringLiteral("source"), source}, {QStringLiteral("event"), event}, {QStringLiteral("args"), arguments}});
 }
 
 } // namespace HmiVehicle

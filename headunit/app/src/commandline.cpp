@@ -30,19 +30,23 @@ QSize sizeFrom(const QString& text)
 
 CommandLine CommandLine::parse(const QStringList& arguments)
 {
-    const QCommandLineOption vehicle(QStringLiteral("vehicle"),
-                                     QStringLiteral("Connect to the vehicle that listens in <dir> instead of the built-in one."),
-                                     QStringLiteral("dir"));
+    const QCommandLineOption vehicle(
+        QStringLiteral("vehicle"),
+        QStringLiteral("Connect to the vehicle that listens in <dir> instead of the built-in one."),
+        QStringLiteral("dir"));
     const QCommandLineOption shot(QStringLiteral("shot"),
                                   QStringLiteral("Draw without a display, write a picture to <file> and exit."),
                                   QStringLiteral("file"));
-    const QCommandLineOption view(QStringLiteral("view"), QStringLiteral("Show this view or popup first."), QStringLiteral("name"));
+    const QCommandLineOption view(QStringLiteral("view"), QStringLiteral("Show this view or popup first."),
+                                  QStringLiteral("name"));
     const QCommandLineOption size(QStringLiteral("size"), QStringLiteral("Size of the window, 1280x720 by default."),
                                   QStringLiteral("WxH"));
     const QCommandLineOption night(QStringLiteral("night"), QStringLiteral("Use the night colours."));
-    const QCommandLineOption listViews(QStringLiteral("list-views"), QStringLiteral("Print the names of all views and popups."));
+    const QCommandLineOption listViews(QStringLiteral("list-views"),
+                                       QStringLiteral("Print the names of all views and popups."));
     const QCommandLineOption record(QStringLiteral("record"),
-                                    QStringLiteral("Write all traffic with the vehicle to <file>."), QStringLiteral("file"));
+                                    QStringLiteral("Write all traffic with the vehicle to <file>."),
+                                    QStringLiteral("file"));
     const QCommandLineOption help({QStringLiteral("h"), QStringLiteral("help")}, QStringLiteral("Print this text."));
 
     QCommandLineParser parser;
@@ -63,7 +67,9 @@ CommandLine CommandLine::parse(const QStringList& arguments)
         line.size = sizeFrom(parser.value(size));
         if (line.size.isEmpty())
             return wrong(QStringLiteral("'%1' is not a size such as 800x480 (sides from %2 to %3).")
-                             .arg(parser.value(size)).arg(smallestSide).arg(largestSide));
+                             .arg(parser.value(size))
+                             .arg(smallestSide)
+                             .arg(largestSide));
     }
     if (parser.isSet(shot) && parser.value(shot).isEmpty())
         return wrong(QStringLiteral("--shot needs the name of a file."));

@@ -56,8 +56,10 @@ NowPlaying::NowPlaying(QObject* parent)
     : QObject(parent)
 {
     connect(GlobalSource::instance(), &GlobalSource::mainAudioSourceChanged, this, &NowPlaying::update);
-    for (TunerSource* const tuner : {static_cast<TunerSource*>(AMTunerSource::instance()), static_cast<TunerSource*>(FMTunerSource::instance()),
-                                     static_cast<TunerSource*>(XMTunerSource::instance()), static_cast<TunerSource*>(DABTunerSource::instance())}) {
+    for (TunerSource* const tuner :
+         {static_cast<TunerSource*>(AMTunerSource::instance()), static_cast<TunerSource*>(FMTunerSource::instance()),
+          static_cast<TunerSource*>(XMTunerSource::instance()),
+          static_cast<TunerSource*>(DABTunerSource::instance())}) {
         connect(tuner, &TunerSource::frequencyChanged, this, &NowPlaying::update);
         connect(tuner, &TunerSource::stationNameChanged, this, &NowPlaying::update);
         connect(tuner, &TunerSource::radioTextChanged, this, &NowPlaying::update);

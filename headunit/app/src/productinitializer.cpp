@@ -120,10 +120,13 @@ void ProductInitializer::completeInitialization()
     QObject::connect(back, &QAbstractTransition::triggered, &goBack);
 
     // A vehicle that has been reset starts with its home module again.
-    QObject::connect(HmiCore::HmiManager::instance(), &HmiCore::HmiManager::masterResetEnd, StateMachine::instance(), [] {
-        framework<ViewManager>("ViewManager")->requestView(HmiCore::HmiManager::instance()->factoryDefaultHomeState());
-    });
-    m_rootContext->setContextProperty(QStringLiteral("_homeState"), HmiCore::HmiManager::instance()->factoryDefaultHomeState());
+    QObject::connect(HmiCore::HmiManager::instance(), &HmiCore::HmiManager::masterResetEnd, StateMachine::instance(),
+                     [] {
+                         framework<ViewManager>("ViewManager")
+                             ->requestView(HmiCore::HmiManager::instance()->factoryDefaultHomeState());
+                     });
+    m_rootContext->setContextProperty(QStringLiteral("_homeState"),
+                                      HmiCore::HmiManager::instance()->factoryDefaultHomeState());
 
     auto* const theme = framework<UiThemeManager>("UiThemeManager");
     m_paletteControl->setMode(m_night ? PaletteControl::Night : PaletteControl::Automatic);

@@ -18,7 +18,8 @@ public:
 
     void initializeSources() override;
     void exportObjects(QQmlContext* rootContext) override;
-    void connectPopupStates(const QList<QPair<HmiStateMachine::StateLevel, HmiStateMachine::PopupState*>>& states) override;
+    void
+    connectPopupStates(const QList<QPair<HmiStateMachine::StateLevel, HmiStateMachine::PopupState*>>& states) override;
     void completeInitialization() override;
     void buildTopStateTree() override;
     HmiStateMachine::HmiState* modulesRootState() override;

@@ -22,7 +22,8 @@ using HmiStateMachine::StateMachine;
 
 namespace {
 
-constexpr int patience = 10000; // ms until a vehicle that does not answer or a view that does not appear counts as missing
+constexpr int patience =
+    10000; // ms until a vehicle that does not answer or a view that does not appear counts as missing
 
 ViewManager* viewManager()
 {
@@ -63,7 +64,8 @@ bool Screenshot::isKnown(const QString& view, QString* message)
         return true;
     QStringList known = descriptor.views.keys() + descriptor.popups.keys();
     known.sort();
-    *message = QStringLiteral("there is no view '%1'; there are: %2").arg(view.left(128), known.join(QStringLiteral(", ")));
+    *message =
+        QStringLiteral("there is no view '%1'; there are: %2").arg(view.left(128), known.join(QStringLiteral(", ")));
     return false;
 }
 
@@ -71,9 +73,12 @@ void Screenshot::start()
 {
     auto* const bridge = BridgeConnection::instance();
     QTimer::singleShot(patience, this, [this, bridge] {
-        fail(1, bridge->synchronised() ? QStringLiteral("the view did not appear") : QStringLiteral("no vehicle has told its state"));
+        fail(1, bridge->synchronised() ? QStringLiteral("the view did not appear")
+                                       : QStringLiteral("no vehicle has told its state"));
     });
-    whenever(bridge, &BridgeConnection::synchronisedChanged, this, [bridge] { return bridge->synchronised(); }, [this] { showView(); });
+    whenever(
+        bridge, &BridgeConnection::synchronisedChanged, this, [bridge] { return bridge->synchronised(); },
+        [this] { showView(); });
 }
 
 void Screenshot::showView()
@@ -83,7 +88,7 @@ void Screenshot::showView()
         if (m_view.isEmpty())
             return !views->currentView().isEmpty();
         return views->currentView() == m_view || views->currentPopup() == m_view
-            || views->currentView().startsWith(m_view + QLatin1Char('.'));
+               || views->currentView().startsWith(m_view + QLatin1Char('.'));
     };
     if (views->guiDescriptor().popups.contains(m_view)) {
         whenever(views, &ViewManager::currentPopupChanged, this, isOnScreen, [this] { shoot(); });

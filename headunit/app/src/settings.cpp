@@ -20,6 +20,7 @@ void applySettings(const QSize& windowSize)
 
     QCoreApplication::setApplicationVersion(QStringLiteral(HEADUNIT_VERSION));
     QFont font;
-    font.setFamilies({QStringLiteral("Inter"), QStringLiteral("Noto Sans Arabic"), QStringLiteral("WenQuanYi Micro Hei")});
+    font.setFamilies(
+        {QStringLiteral("Inter"), QStringLiteral("Noto Sans Arabic"), QStringLiteral("WenQuanYi Micro Hei")});
     QGuiApplication::setFont(font);
 }

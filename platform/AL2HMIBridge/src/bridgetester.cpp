@@ -71,7 +71,8 @@ BridgeTester::~BridgeTester()
 
 bool BridgeTester::setState(const QString& source, const QVariantMap& state)
 {
-    return sendObject({{QStringLiteral("source"), source}, {QStringLiteral("state"), QJsonObject::fromVariantMap(state)}});
+    return sendObject(
+        {{QStringLiteral("source"), source}, {QStringLiteral("state"), QJsonObject::fromVariantMap(state)}});
 }
 
 bool BridgeTester::setState(const char* source, std::initializer_list<std::pair<const char*, QVariant>> state)

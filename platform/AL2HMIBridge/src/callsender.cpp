@@ -58,7 +58,8 @@ bool sendCall(BridgeEndpoint::Channel channel, const QString& source, const QStr
         tapLine(channel, Direction::Out, line);
         return true;
     }
-    qCWarning(bridgeLog).noquote() << "Call dropped:" << shown(source) + QLatin1Char('.') + shown(call) << "-" << reason;
+    qCWarning(bridgeLog).noquote() << "Call dropped:" << shown(source) + QLatin1Char('.') + shown(call) << "-"
+                                   << reason;
     return false;
 }
 

@@ -72,8 +72,9 @@ bool ChannelReader::feedLine(const QByteArray& line, std::vector<Message>* messa
 bool ChannelReader::takeGreeting(const Message& message, const QString& problem, std::vector<Message>* messages)
 {
     if (!problem.isEmpty() || message.kind != Message::Greeting) {
-        m_refusals.report(QStringLiteral("no greeting: ")
-                          + (problem.isEmpty() ? QStringLiteral("the first line must tell the protocol version") : problem));
+        m_refusals.report(
+            QStringLiteral("no greeting: ")
+            + (problem.isEmpty() ? QStringLiteral("the first line must tell the protocol version") : problem));
         return false;
     }
     m_greeted = true;

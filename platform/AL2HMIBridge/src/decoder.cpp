@@ -67,7 +67,10 @@ QString decodeState(const QJsonObject& line, Message* message)
 QString decodeArguments(const QJsonArray& values, const Event& event, Message* message)
 {
     if (values.size() != event.arguments.count)
-        return QStringLiteral(".%1: %2 arguments instead of %3").arg(event.name).arg(values.size()).arg(event.arguments.count);
+        return QStringLiteral(".%1: %2 arguments instead of %3")
+            .arg(event.name)
+            .arg(values.size())
+            .arg(event.arguments.count);
     message->arguments.resize(size_t(values.size()));
     for (int i = 0; i < event.arguments.count; ++i) {
         const Argument& argument = event.arguments.first[i];

@@ -20,13 +20,15 @@ namespace {
 /// The opened directory, so that what was checked is what is used.
 FileDescriptor openOwnDirectory(const QString& path, QString* problem)
 {
-    FileDescriptor directory(::open(QFile::encodeName(path).constData(), O_PATH | O_DIRECTORY | O_NOFOLLOW | O_CLOEXEC));
+    FileDescriptor directory(
+        ::open(QFile::encodeName(path).constData(), O_PATH | O_DIRECTORY | O_NOFOLLOW | O_CLOEXEC));
     if (!directory.isValid()) {
         if (errno != ENOENT)
             *problem = QStringLiteral("it is not a directory that can be opened");
         return directory;
     }
-    struct stat status{};
+    struct stat status
+    {};
     if (::fstat(directory.get(), &status) != 0 || status.st_uid != ::geteuid())
         *problem = QStringLiteral("it belongs to another user");
     else if (status.st_mode & (S_IRWXG | S_IRWXO))
@@ -73,7 +75,8 @@ FileDescriptor Dialer::dial()
     const BridgeEndpoint::Connector connector = BridgeEndpoint::connector();
     FileDescriptor socket = connector ? FileDescriptor(connector(m_channel)) : connectInDirectory(&problem);
     if (socket.isValid() && !isOwnPeer(socket.get())) {
-        problem = QStringLiteral("Peer on %1 refused: it is run by another user").arg(BridgeEndpoint::channelName(m_channel));
+        problem =
+            QStringLiteral("Peer on %1 refused: it is run by another user").arg(BridgeEndpoint::channelName(m_channel));
         socket = FileDescriptor();
     }
     if (!problem.isEmpty() && problem != m_reported)

@@ -34,7 +34,8 @@ void Inbox::push(std::vector<Message>&& messages)
         const std::lock_guard<std::mutex> lock(m_mutex);
         for (const Message& message : messages)
             m_arrivedBytes += message.bytes;
-        m_arrived.insert(m_arrived.end(), std::make_move_iterator(messages.begin()), std::make_move_iterator(messages.end()));
+        m_arrived.insert(m_arrived.end(), std::make_move_iterator(messages.begin()),
+                         std::make_move_iterator(messages.end()));
         announce = !std::exchange(m_announced, true);
     }
     if (announce)

@@ -26,12 +26,12 @@ struct Message
 
     Kind kind = State;
     BridgeEndpoint::Channel channel = BridgeEndpoint::Messages;
-    const SourceInfo* source = nullptr;           ///< of State and Event
+    const SourceInfo* source = nullptr; ///< of State and Event
     const AL2HMIBridge::Event* event = nullptr;
-    std::vector<FieldValue> fields;               ///< of State
-    std::vector<Value> arguments;                 ///< of Event
-    std::vector<SourceState> snapshot;            ///< of Snapshot; what is not in it is at its default
-    int bytes = 0;                                ///< length of the text it came from
+    std::vector<FieldValue> fields;    ///< of State
+    std::vector<Value> arguments;      ///< of Event
+    std::vector<SourceState> snapshot; ///< of Snapshot; what is not in it is at its default
+    int bytes = 0;                     ///< length of the text it came from
 };
 
 /// Brings a message to the sources: stores all values, then announces those that changed. GUI thread.

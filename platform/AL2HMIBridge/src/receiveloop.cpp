@@ -37,8 +37,8 @@ public:
     ~OpenLink()
     {
         if (const int lost = m_outbox.close())
-            qCWarning(bridgeLog).noquote() << "Peer on" << BridgeEndpoint::channelName(m_channel) << "gone before it read"
-                                           << lost << "calls; they are dropped";
+            qCWarning(bridgeLog).noquote() << "Peer on" << BridgeEndpoint::channelName(m_channel)
+                                           << "gone before it read" << lost << "calls; they are dropped";
         if (!announced)
             return;
         Message message;
@@ -118,8 +118,8 @@ bool ReceiveLoop::serve(FileDescriptor opened)
             m_outbox.setReady();
         }
         if (!reader.greeted() && greeting.hasExpired()) {
-            qCWarning(bridgeLog).noquote() << "Peer on" << BridgeEndpoint::channelName(m_channel)
-                                           << "refused: it does not greet";
+            qCWarning(bridgeLog).noquote()
+                << "Peer on" << BridgeEndpoint::channelName(m_channel) << "refused: it does not greet";
             return false;
         }
     }

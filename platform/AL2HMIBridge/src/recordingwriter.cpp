@@ -77,8 +77,8 @@ QByteArray RecordingWriter::stamp(const Entry& entry) const
 {
     const std::chrono::duration<double> since = entry.time - m_start;
     return "{\"t\":" + QByteArray::number(since.count(), 'f', 6) + ",\"channel\":\""
-        + BridgeEndpoint::channelName(entry.channel).toLatin1() + "\",\"direction\":\""
-        + (entry.direction == Direction::In ? "in" : "out") + "\",";
+           + BridgeEndpoint::channelName(entry.channel).toLatin1() + "\",\"direction\":\""
+           + (entry.direction == Direction::In ? "in" : "out") + "\",";
 }
 
 void RecordingWriter::write(const Entry& entry)
@@ -96,7 +96,8 @@ void RecordingWriter::put(const QByteArray& line)
     if (m_failed || m_file->write(line) == line.size())
         return;
     m_failed = true;
-    qCWarning(bridgeLog).noquote() << "The recording ends early:" << m_file->fileName() + QLatin1Char(':') << m_file->errorString();
+    qCWarning(bridgeLog).noquote() << "The recording ends early:" << m_file->fileName() + QLatin1Char(':')
+                                   << m_file->errorString();
 }
 
 } // namespace AL2HMIBridge

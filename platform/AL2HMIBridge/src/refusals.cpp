@@ -29,7 +29,8 @@ void Refusals::report(const QString& problem)
         return;
     }
     ++m_reported;
-    qCWarning(bridgeLog).noquote() << "Line refused on" << BridgeEndpoint::channelName(m_channel) + QLatin1Char(':') << problem;
+    qCWarning(bridgeLog).noquote() << "Line refused on" << BridgeEndpoint::channelName(m_channel) + QLatin1Char(':')
+                                   << problem;
 }
 
 void Refusals::reportRest()

@@ -5,7 +5,8 @@ namespace AL2HMIBridge {
 
 namespace {
 
-template<class T> const T* findByName(Rows<T> rows, const QString& name)
+template <class T>
+const T* findByName(Rows<T> rows, const QString& name)
 {
     for (const T& row : rows)
         if (row.name == name)

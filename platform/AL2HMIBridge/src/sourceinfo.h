@@ -20,7 +20,8 @@ using Value = std::variant<bool, int, double, QString, QList<int>, QVariantList>
 enum class ValueType { Bool, Int, Real, Text, IntList, Records };
 
 /// A table that stands in constant memory.
-template<class T> struct Rows
+template <class T>
+struct Rows
 {
     const T* first = nullptr;
     int count = 0;
@@ -34,8 +35,8 @@ struct Record;
 struct ValueShape
 {
     ValueType type;
-    double minimum; ///< of a number; 0 for texts and lists
-    double maximum; ///< of a number; of the length of a text or list
+    double minimum;  ///< of a number; 0 for texts and lists
+    double maximum;  ///< of a number; of the length of a text or list
     Rows<int> known; ///< the only numbers allowed, when there are any
     const Record* record;
 };
@@ -96,7 +97,8 @@ struct SourceTable
     static const Event* findEvent(const SourceInfo& source, const QString& name);
 
     /// Calls \a visit with every field of a source, those of its bases included.
-    template<class Visit> static void forEachField(const SourceInfo& source, Visit visit)
+    template <class Visit>
+    static void forEachField(const SourceInfo& source, Visit visit)
     {
         for (const SourceInfo* part = &source; part; part = part->base)
             for (const Field& field : part->fields)

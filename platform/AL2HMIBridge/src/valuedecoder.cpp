@@ -58,7 +58,11 @@ QString decodeIntList(const QJsonValue& json, const ValueShape& shape, Value* va
     const QJsonArray array = json.toArray();
     if (array.size() > shape.maximum)
         return QStringLiteral("more than %1 entries").arg(shape.maximum);
-    const ValueShape entry{ValueType::Int, std::numeric_limits<int>::min(), std::numeric_limits<int>::max(), {}, nullptr};
+    const ValueShape entry{ValueType::Int,
+                           std::numeric_limits<int>::min(),
+                           std::numeric_limits<int>::max(),
+                           {},
+                           nullptr};
     QList<int> list;
     list.reserve(array.size());
     for (const QJsonValue element : array) {
@@ -100,8 +104,8 @@ QString decodeRecords(const QJsonValue& json, const ValueShape& shape, Value* va
     list.reserve(array.size());
     for (const QJsonValue entry : array) {
         QVariantMap map;
-        const QString problem = entry.isObject() ? decodeRecord(entry.toObject(), *shape.record, &map)
-                                                 : QStringLiteral("not an object");
+        const QString problem =
+            entry.isObject() ? decodeRecord(entry.toObject(), *shape.record, &map) : QStringLiteral("not an object");
         if (!problem.isEmpty())
             return QStringLiteral("entry %1: %2").arg(list.size()).arg(problem);
         list.append(map);

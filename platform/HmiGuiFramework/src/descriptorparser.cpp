@@ -94,7 +94,8 @@ public:
             error(field, QStringLiteral("must be an object of file by variation"));
         const QJsonObject object = value.toObject();
         for (auto it = object.begin(); it != object.end(); ++it)
-            byName.insert(it.key(), resolved(QLatin1String(field) + QLatin1Char('.') + it.key(), it.value().toString()));
+            byName.insert(it.key(),
+                          resolved(QLatin1String(field) + QLatin1Char('.') + it.key(), it.value().toString()));
         return byName;
     }
 
@@ -118,7 +119,8 @@ public:
     void error(const QString& field, const QString& text)
     {
         if (hasNoErrors()) // one complaint per entry is enough
-            m_errors->append((m_where.isEmpty() ? field : m_where + QLatin1Char('.') + field) + QStringLiteral(": ") + text);
+            m_errors->append((m_where.isEmpty() ? field : m_where + QLatin1Char('.') + field) + QStringLiteral(": ")
+                             + text);
     }
 
 private:

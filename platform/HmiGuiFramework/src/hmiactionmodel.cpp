@@ -29,8 +29,9 @@ void HmiActionModel::addChild(HmiAction* action)
 void HmiActionModel::sortActions()
 {
     beginResetModel();
-    std::stable_sort(m_actions.begin(), m_actions.end(),
-                     [](const QPointer<HmiAction>& a, const QPointer<HmiAction>& b) { return a->order() < b->order(); });
+    std::stable_sort(
+        m_actions.begin(), m_actions.end(),
+        [](const QPointer<HmiAction>& a, const QPointer<HmiAction>& b) { return a->order() < b->order(); });
     endResetModel();
 }
 

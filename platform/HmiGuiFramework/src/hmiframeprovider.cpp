@@ -60,7 +60,8 @@ QImage HmiFrameProvider::requestImage(const QString& id, QSize* size, const QSiz
     if (image.isNull())
         image = transparentPixel();
     else if (requestedSize.width() > 0 && requestedSize.height() > 0 && requestedSize != image.size()) {
-        const QString key = QStringLiteral("%1@%2x%3").arg(image.cacheKey()).arg(requestedSize.width()).arg(requestedSize.height());
+        const QString key =
+            QStringLiteral("%1@%2x%3").arg(image.cacheKey()).arg(requestedSize.width()).arg(requestedSize.height());
         const QMutexLocker lock(&m_mutex);
         if (const QImage* const scaled = m_scaled.object(key)) {
             image = *scaled;

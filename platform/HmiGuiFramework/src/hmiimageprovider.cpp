@@ -59,7 +59,8 @@ QImage draw(const QString& file, const QColor& color, const QSize& requestedSize
     const QImage image(file);
     if (!requestedSize.isValid() || image.isNull())
         return image;
-    return image.scaled(requestedSize.boundedTo(QSize(largestSide, largestSide)), Qt::KeepAspectRatio, Qt::SmoothTransformation);
+    return image.scaled(requestedSize.boundedTo(QSize(largestSide, largestSide)), Qt::KeepAspectRatio,
+                        Qt::SmoothTransformation);
 }
 
 /// QML's sourceSize may give one side only.
@@ -102,7 +103,8 @@ QImage HmiImageProvider::requestImage(const QString& id, QSize* size, const QSiz
     const QString file = fileOf(name);
     const QImage image = file.isEmpty() ? QImage() : draw(file, color, complete(requestedSize));
     if (image.isNull())
-        qCWarning(guiCategory).noquote() << "icon" << name.left(128) << (file.isEmpty() ? "does not exist" : "cannot be drawn");
+        qCWarning(guiCategory).noquote() << "icon" << name.left(128)
+                                         << (file.isEmpty() ? "does not exist" : "cannot be drawn");
     if (size)
         *size = image.size();
     const QMutexLocker lock(&m_mutex);

@@ -35,7 +35,8 @@ public:
     QStringList names() const;
 
     /// Puts a popup on the stack or renews it. False, with \a error, when it would be topmost but cannot be created or entered.
-    bool push(const PopupDescriptor& descriptor, HmiStateMachine::PopupState* state, const QVariant& data, QString* error);
+    bool push(const PopupDescriptor& descriptor, HmiStateMachine::PopupState* state, const QVariant& data,
+              QString* error);
 
     void remove(const QString& name);
 
@@ -66,7 +67,7 @@ private:
 
     ViewCache* const m_cache;
     QPointer<QQuickItem> m_area;
-    QVector<Entry> m_entries; // last is topmost
+    QVector<Entry> m_entries;  // last is topmost
     QSet<QObject*> m_expected; // states that were requested and are not entered yet; never followed
     QString m_shown;
     QPointer<QQuickItem> m_item;

@@ -31,7 +31,8 @@ void StatusBarController::requestTransientWidget(const QString& identifier, int 
     }
     const QUrl url = known.components.value(found->componentKey).url;
     if (url.isEmpty()) {
-        qCWarning(guiCategory).noquote() << "transient" << identifier << "refused: there is no component" << found->componentKey;
+        qCWarning(guiCategory).noquote() << "transient" << identifier << "refused: there is no component"
+                                         << found->componentKey;
         return;
     }
     m_timer.start(timeout > 0 ? timeout : found->timeout);

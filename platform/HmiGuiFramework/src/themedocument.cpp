@@ -51,7 +51,8 @@ ThemeDocument ThemeDocument::read(const QString& path)
     }
     document.defaultPalette = file.object.value(QLatin1String("defaultPalette")).toString(byName.constBegin().key());
     if (!document.palettes.contains(document.defaultPalette))
-        return failure(QStringLiteral("defaultPalette"), QStringLiteral("there is no palette \"%1\"").arg(document.defaultPalette));
+        return failure(QStringLiteral("defaultPalette"),
+                       QStringLiteral("there is no palette \"%1\"").arg(document.defaultPalette));
     const QJsonObject values = file.object.value(QLatin1String("values")).toObject();
     for (auto value = values.begin(); value != values.end(); ++value) {
         if (!value.value().isDouble() && !value.value().isString())

@@ -271,8 +271,8 @@ void ViewManager::showNextView()
     if (changed)
         Q_EMIT currentViewChanged();
     if (m_transitionManager)
-        m_transitionManager->run(outgoing, incoming, request.transition.isEmpty() ? descriptor.transition : request.transition,
-                                 reverse);
+        m_transitionManager->run(outgoing, incoming,
+                                 request.transition.isEmpty() ? descriptor.transition : request.transition, reverse);
 }
 
 void ViewManager::transitionFinished()

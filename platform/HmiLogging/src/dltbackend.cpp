@@ -75,8 +75,9 @@ void applyLevel(const QByteArray& category, int level)
     for (auto it = wanted.constBegin(); it != wanted.constEnd(); ++it) {
         const QString name = QString::fromLatin1(it.key());
         const auto rule = [&](const char* suffix, int needed) {
-            rules += QStringLiteral("%1.%2=%3\n").arg(name, QLatin1String(suffix),
-                                                      it.value() >= needed ? QStringLiteral("true") : QStringLiteral("false"));
+            rules += QStringLiteral("%1.%2=%3\n")
+                         .arg(name, QLatin1String(suffix),
+                              it.value() >= needed ? QStringLiteral("true") : QStringLiteral("false"));
         };
         rule("debug", DLT_LOG_DEBUG);
         rule("info", DLT_LOG_INFO);
@@ -96,8 +97,8 @@ void levelChanged(char contextId[DLT_ID_SIZE], uint8_t level, uint8_t)
     }
     if (category.isEmpty() || !QCoreApplication::instance())
         return;
-    QMetaObject::invokeMethod(QCoreApplication::instance(), [category, level] { applyLevel(category, level); },
-                              Qt::QueuedConnection);
+    QMetaObject::invokeMethod(
+        QCoreApplication::instance(), [category, level] { applyLevel(category, level); }, Qt::QueuedConnection);
 }
 
 /// One DLT context per category; ids are numbered because names do not fit into four characters.

@@ -68,7 +68,8 @@ bool MessageHandler::dltActive() const
     return dltStarted;
 }
 
-QString MessageHandler::format(double seconds, QtMsgType type, const QMessageLogContext& context, const QString& message)
+QString MessageHandler::format(double seconds, QtMsgType type, const QMessageLogContext& context,
+                               const QString& message)
 {
     return QStringLiteral("[%1] %2 %3: %4")
         .arg(seconds, 12, 'f', 6)

@@ -37,7 +37,8 @@ void KeySignalTransition::makeGloballyAvailable()
 
 bool KeySignalTransition::eventTest(QEvent* event)
 {
-    return event->type() == KeySignalEvent::eventType() && static_cast<KeySignalEvent*>(event)->keySignal == m_keySignal;
+    return event->type() == KeySignalEvent::eventType()
+           && static_cast<KeySignalEvent*>(event)->keySignal == m_keySignal;
 }
 
 void KeySignalTransition::onTransition(QEvent*) {}

@@ -15,7 +15,7 @@ StateRequestTransition::StateRequestTransition(QState* source, QAbstractState* t
 bool StateRequestTransition::eventTest(QEvent* event)
 {
     return event->type() == StateRequestEvent::eventType()
-        && static_cast<StateRequestEvent*>(event)->target == targetState() && !targetState()->active();
+           && static_cast<StateRequestEvent*>(event)->target == targetState() && !targetState()->active();
 }
 
 void StateRequestTransition::onTransition(QEvent*) {}

@@ -34,7 +34,10 @@ public:
     }
 
     void startMessages() { (messages = AL2HMIBridge::MessageReceiveThread::createInstance(&owner))->begin(); }
-    void startPriority() { (priority = AL2HMIBridge::MessageReceivePriorityQueueThread::createInstance(&owner))->begin(); }
+    void startPriority()
+    {
+        (priority = AL2HMIBridge::MessageReceivePriorityQueueThread::createInstance(&owner))->begin();
+    }
     void startTouch() { (touch = new AL2HMIBridge::TouchInputReceiverThread(&owner))->begin(); }
 
     void stop()
@@ -50,9 +53,11 @@ public:
     bool sendMarker(PeerSocket& socket)
     {
         ++m_marker;
-        return socket.sendLine("{\"source\":\"GlobalSource\",\"state\":{\"destinationCountry\":" + QByteArray::number(m_marker) + "}}")
-            && QTest::qWaitFor([this] { return AL2HMIBridge::GlobalSource::instance()->destinationCountry() == m_marker; },
-                               FakePeer::deadline);
+        return socket.sendLine("{\"source\":\"GlobalSource\",\"state\":{\"destinationCountry\":"
+                               + QByteArray::number(m_marker) + "}}")
+               && QTest::qWaitFor(
+                   [this] { return AL2HMIBridge::GlobalSource::instance()->destinationCountry() == m_marker; },
+                   FakePeer::deadline);
     }
 
     QStringList takeWarnings() { return log.take(QStringLiteral("al2hmi.bridge"), QtWarningMsg); }

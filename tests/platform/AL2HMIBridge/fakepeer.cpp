@@ -72,7 +72,8 @@ bool PeerSocket::send(const QByteArray& bytes)
     while (sent < bytes.size()) {
         if (!ready(m_fd, POLLOUT, deadline))
             return false;
-        const auto count = ::send(m_fd, bytes.constData() + sent, size_t(bytes.size() - sent), MSG_NOSIGNAL | MSG_DONTWAIT);
+        const auto count =
+            ::send(m_fd, bytes.constData() + sent, size_t(bytes.size() - sent), MSG_NOSIGNAL | MSG_DONTWAIT);
         if (count < 0 && errno != EAGAIN)
             return false;
         sent += qMax<qint64>(count, 0);
@@ -116,7 +117,7 @@ bool PeerSocket::waitForHangUp()
 bool PeerSocket::greet()
 {
     return isOpen() && readLine() == "{\"protocol\":1,\"peer\":\"hmi\"}"
-        && sendLine("{\"protocol\":1,\"peer\":\"application-layer\"}");
+           && sendLine("{\"protocol\":1,\"peer\":\"application-layer\"}");
 }
 
 bool PeerSocket::greetWithSnapshot(const QByteArray& stateLines)

@@ -40,7 +40,8 @@ QJsonObject recordSample(const QString& name, int salt)
     QFile file(QStringLiteral(BRIDGE_TABLE));
     if (!file.open(QIODevice::ReadOnly))
         return QJsonObject();
-    const QJsonArray records = QJsonDocument::fromJson(file.readAll()).object().value(QStringLiteral("records")).toArray();
+    const QJsonArray records =
+        QJsonDocument::fromJson(file.readAll()).object().value(QStringLiteral("records")).toArray();
     QJsonObject sample;
     for (const QJsonValue record : records) {
         if (record.toObject().value(QStringLiteral("name")).toString() != name)
@@ -130,7 +131,8 @@ QList<TableSource> readSourceTable()
     QFile file(QStringLiteral(BRIDGE_TABLE));
     if (!file.open(QIODevice::ReadOnly))
         return {};
-    const QJsonArray sources = QJsonDocument::fromJson(file.readAll()).object().value(QStringLiteral("sources")).toArray();
+    const QJsonArray sources =
+        QJsonDocument::fromJson(file.readAll()).object().value(QStringLiteral("sources")).toArray();
     QHash<QString, TableSource> byName;
     QList<TableSource> table;
     for (const QJsonValue value : sources) {

@@ -47,7 +47,8 @@ private Q_SLOTS:
         row("half an object", "{\"source\":\"GlobalSource\"", "not JSON: ");
         row("two objects", "{}{}", "not JSON: ");
         row("array", "[1]", "not a JSON object");
-        row("not UTF-8 in a text", "{\"source\":\"FMTunerSource\",\"state\":{\"radioText\":\"\xff\xfe\"}}", "not JSON: ");
+        row("not UTF-8 in a text", "{\"source\":\"FMTunerSource\",\"state\":{\"radioText\":\"\xff\xfe\"}}",
+            "not JSON: ");
         row("control bytes", "\x01\x02\x1b[31m", "not JSON: ");
         row("NaN", "{\"source\":\"GlobalSource\",\"state\":{\"volume\":NaN}}", "not JSON: ");
         row("number beyond doubles", "{\"source\":\"GlobalSource\",\"state\":{\"outsideTemperature\":1e999}}", "");
@@ -66,24 +67,35 @@ private Q_SLOTS:
             "GlobalSource: \"state\" must be an object and stand alone beside the source");
         row("one key too many", "{\"source\":\"GlobalSource\",\"state\":{},\"more\":1}",
             "GlobalSource: \"state\" must be an object and stand alone beside the source");
-        row("unknown state", "{\"source\":\"GlobalSource\",\"state\":{\"volume\":3,\"bass\":1}}", "GlobalSource.bass: no such state");
-        row("other tuner's state", "{\"source\":\"AMTunerSource\",\"state\":{\"stereo\":true}}", "AMTunerSource.stereo: no such state");
-        row("text for an integer", "{\"source\":\"GlobalSource\",\"state\":{\"volume\":\"3\"}}", "GlobalSource.volume: not an integer");
-        row("fraction for an integer", "{\"source\":\"GlobalSource\",\"state\":{\"volume\":3.5}}", "GlobalSource.volume: not an integer");
+        row("unknown state", "{\"source\":\"GlobalSource\",\"state\":{\"volume\":3,\"bass\":1}}",
+            "GlobalSource.bass: no such state");
+        row("other tuner's state", "{\"source\":\"AMTunerSource\",\"state\":{\"stereo\":true}}",
+            "AMTunerSource.stereo: no such state");
+        row("text for an integer", "{\"source\":\"GlobalSource\",\"state\":{\"volume\":\"3\"}}",
+            "GlobalSource.volume: not an integer");
+        row("fraction for an integer", "{\"source\":\"GlobalSource\",\"state\":{\"volume\":3.5}}",
+            "GlobalSource.volume: not an integer");
         row("null", "{\"source\":\"GlobalSource\",\"state\":{\"volume\":null}}", "GlobalSource.volume: not an integer");
-        row("below the range", "{\"source\":\"GlobalSource\",\"state\":{\"volume\":-1}}", "GlobalSource.volume: -1 is out of range");
-        row("above the range", "{\"source\":\"GlobalSource\",\"state\":{\"volume\":41}}", "GlobalSource.volume: 41 is out of range");
+        row("below the range", "{\"source\":\"GlobalSource\",\"state\":{\"volume\":-1}}",
+            "GlobalSource.volume: -1 is out of range");
+        row("above the range", "{\"source\":\"GlobalSource\",\"state\":{\"volume\":41}}",
+            "GlobalSource.volume: 41 is out of range");
         row("beyond 32 bits", "{\"source\":\"GlobalSource\",\"state\":{\"destinationCountry\":2147483648}}",
             "GlobalSource.destinationCountry: 2147483648 is out of range");
         row("beyond 64 bits", "{\"source\":\"GlobalSource\",\"state\":{\"destinationCountry\":1e40}}",
             "GlobalSource.destinationCountry: 1e+40 is out of range");
         row("real out of range", "{\"source\":\"GlobalSource\",\"state\":{\"vehicleSpeed\":-0.5}}",
             "GlobalSource.vehicleSpeed: -0.5 is out of range");
-        row("number for a truth value", "{\"source\":\"GlobalSource\",\"state\":{\"muted\":1}}", "GlobalSource.muted: not true or false");
-        row("unknown enumerator", "{\"source\":\"CDSource\",\"state\":{\"cdStatus\":9}}", "CDSource.cdStatus: 9 is not in the enumeration");
-        row("text too long", "{\"source\":\"PhoneSource\",\"state\":{\"callerNumber\":\"" + QByteArray(65, '1') + "\"}}",
+        row("number for a truth value", "{\"source\":\"GlobalSource\",\"state\":{\"muted\":1}}",
+            "GlobalSource.muted: not true or false");
+        row("unknown enumerator", "{\"source\":\"CDSource\",\"state\":{\"cdStatus\":9}}",
+            "CDSource.cdStatus: 9 is not in the enumeration");
+        row("text too long",
+            "{\"source\":\"PhoneSource\",\"state\":{\"callerNumber\":\"" + QByteArray(65, '1') + "\"}}",
             "PhoneSource.callerNumber: longer than 64");
-        row("list too long", "{\"source\":\"GlobalSource\",\"state\":{\"supportedLanguages\":[" + QByteArray(64, '1').replace("1", "1,") + "1]}}",
+        row("list too long",
+            "{\"source\":\"GlobalSource\",\"state\":{\"supportedLanguages\":[" + QByteArray(64, '1').replace("1", "1,")
+                + "1]}}",
             "GlobalSource.supportedLanguages: more than 64 entries");
         row("wrong entry", "{\"source\":\"GlobalSource\",\"state\":{\"supportedLanguages\":[1,\"2\"]}}",
             "GlobalSource.supportedLanguages: entry 1: not an integer");
@@ -91,13 +103,16 @@ private Q_SLOTS:
             "PhoneSource.contacts: entry 0: not an object");
         row("record lacks a field", "{\"source\":\"PhoneSource\",\"state\":{\"contacts\":[{\"name\":\"A\"}]}}",
             "PhoneSource.contacts: entry 0: not all and only the fields of Contact");
-        row("record with another field", "{\"source\":\"PhoneSource\",\"state\":{\"contacts\":[{\"name\":\"A\",\"mail\":\"\"}]}}",
+        row("record with another field",
+            "{\"source\":\"PhoneSource\",\"state\":{\"contacts\":[{\"name\":\"A\",\"mail\":\"\"}]}}",
             "PhoneSource.contacts: entry 0: number is missing");
-        row("record with a wrong field", "{\"source\":\"PhoneSource\",\"state\":{\"contacts\":[{\"name\":\"A\",\"number\":1}]}}",
+        row("record with a wrong field",
+            "{\"source\":\"PhoneSource\",\"state\":{\"contacts\":[{\"name\":\"A\",\"number\":1}]}}",
             "PhoneSource.contacts: entry 0: number: not a text");
         row("key on the wrong channel", "{\"source\":\"KeySource\",\"event\":\"keyEvent\",\"args\":[7,0]}",
             "KeySource: belongs on \"priority\"");
-        row("unknown event", "{\"source\":\"GlobalSource\",\"event\":\"honk\",\"args\":[]}", "GlobalSource.honk: no such event");
+        row("unknown event", "{\"source\":\"GlobalSource\",\"event\":\"honk\",\"args\":[]}",
+            "GlobalSource.honk: no such event");
         row("second greeting", "{\"protocol\":1,\"peer\":\"application-layer\"}", "a second greeting");
         row("snapshot not begun", "{\"snapshot\":\"complete\"}", "no snapshot is under way");
         row("half a snapshot", "{\"snapshot\":\"half\"}", "\"snapshot\" must be \"complete\"");
@@ -128,7 +143,8 @@ private Q_SLOTS:
     {
         QTest::addColumn<QByteArray>("line");
         QTest::addColumn<QString>("problem");
-        row("unknown event", "{\"source\":\"KeySource\",\"event\":\"keyEvnt\",\"args\":[7,0]}", "KeySource.keyEvnt: no such event");
+        row("unknown event", "{\"source\":\"KeySource\",\"event\":\"keyEvnt\",\"args\":[7,0]}",
+            "KeySource.keyEvnt: no such event");
         row("too few", "{\"source\":\"KeySource\",\"event\":\"keyEvent\",\"args\":[7]}",
             "KeySource.keyEvent: 1 arguments instead of 2");
         row("text", "{\"source\":\"KeySource\",\"event\":\"keyEvent\",\"args\":[7,\"0\"]}",
@@ -171,7 +187,8 @@ private Q_SLOTS:
         for (const int size : {1024 * 1024, 3 * 1024 * 1024}) {
             QVERIFY(m_messages.sendLine(start + QByteArray(size - 1 - start.size(), ' ') + '}'));
             QVERIFY(m_bridge->sendMarker(m_messages));
-            QCOMPARE(m_bridge->takeWarnings(), QStringList(QStringLiteral("Line refused on messages: longer than 1048576 bytes")));
+            QCOMPARE(m_bridge->takeWarnings(),
+                     QStringList(QStringLiteral("Line refused on messages: longer than 1048576 bytes")));
             QCOMPARE(GlobalSource::instance()->volume(), 0);
         }
     }
@@ -182,7 +199,8 @@ private Q_SLOTS:
         m_messages.close();
         QTRY_VERIFY(!BridgeFixture::connected());
         QCOMPARE(GlobalSource::instance()->volume(), 0);
-        QVERIFY(m_bridge->log.takeOne(QtWarningMsg, QStringLiteral("Line refused on messages: the peer hung up in the middle of a line")));
+        QVERIFY(m_bridge->log.takeOne(
+            QtWarningMsg, QStringLiteral("Line refused on messages: the peer hung up in the middle of a line")));
     }
 
     void messagesMayArriveInAnyPieces()
@@ -211,7 +229,9 @@ private Q_SLOTS:
         const QStringList warnings = m_bridge->takeWarnings();
         int counted = 0;
         for (const QString& warning : warnings)
-            counted += warning.contains(QStringLiteral("more within a second")) ? warning.section(QLatin1Char(' '), 4, 4).toInt() : 1;
+            counted += warning.contains(QStringLiteral("more within a second"))
+                           ? warning.section(QLatin1Char(' '), 4, 4).toInt()
+                           : 1;
         QCOMPARE(counted, 5000);
         QVERIFY2(warnings.size() < 2500, qPrintable(QString::number(warnings.size())));
     }

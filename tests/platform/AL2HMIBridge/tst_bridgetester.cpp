@@ -81,17 +81,20 @@ private Q_SLOTS:
     {
         const BridgeTester tester;
         QVERIFY(!BridgeTester::setState("CDSource", {{"cdStatus", 4}}));
-        QVERIFY(m_log->takeOne(QtWarningMsg, QStringLiteral("Line refused on messages: CDSource.cdStatus: 4 is not in the enumeration")));
+        QVERIFY(m_log->takeOne(
+            QtWarningMsg, QStringLiteral("Line refused on messages: CDSource.cdStatus: 4 is not in the enumeration")));
     }
 
     void withoutATesterCallsWithoutAPeerAreReportedAndDropped()
     {
         GlobalSource::instance()->sendShortSeekUp();
-        QVERIFY(m_log->takeOne(QtWarningMsg, QStringLiteral("Call dropped: GlobalSource.sendShortSeekUp - no peer is connected")));
+        QVERIFY(m_log->takeOne(QtWarningMsg,
+                               QStringLiteral("Call dropped: GlobalSource.sendShortSeekUp - no peer is connected")));
         QVERIFY(!HMI2NAVMessageSender::instance()->send(QStringLiteral("TouchInput"), QStringLiteral("x\ny")));
         QVERIFY(m_log->takeOne(QtWarningMsg, QStringLiteral("Call dropped: TouchInput.x?y - no peer is connected")));
         const BridgeTester tester;
-        QVERIFY(HMI2ALMessageSender::instance()->send(QStringLiteral("Any"), QStringLiteral("thing"), {1, QStringLiteral("a")}));
+        QVERIFY(HMI2ALMessageSender::instance()->send(QStringLiteral("Any"), QStringLiteral("thing"),
+                                                      {1, QStringLiteral("a")}));
         QCOMPARE(BridgeTester::takeCalls(), QStringList({QStringLiteral("Any.thing(1, \"a\")")}));
     }
 };

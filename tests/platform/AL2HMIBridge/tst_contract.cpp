@@ -29,32 +29,45 @@ using namespace AL2HMIBridge;
 
 // The signatures that code written against any platform relies on; a wrong one does not compile.
 
-template<class Class> constexpr bool isSource = std::is_base_of_v<QObject, Class> && std::is_same_v<decltype(Class::instance()), Class*>;
-template<class Enum> constexpr bool isIntEnum = std::is_enum_v<Enum> && std::is_same_v<std::underlying_type_t<Enum>, int> && std::is_convertible_v<Enum, int>;
+template <class Class>
+constexpr bool isSource = std::is_base_of_v<QObject, Class>&& std::is_same_v<decltype(Class::instance()), Class*>;
+template <class Enum>
+constexpr bool isIntEnum =
+    std::is_enum_v<Enum>&& std::is_same_v<std::underlying_type_t<Enum>, int>&& std::is_convertible_v<Enum, int>;
 
 #define GETTER(Class, Type, name) static_assert(std::is_same_v<decltype(&Class::name), Type (Class::*)() const>)
-#define CALL(Class, name, arguments) static_assert(std::is_same_v<decltype(&Class::name), void (Class::*) arguments>)
+#define CALL(Class, name, arguments) static_assert(std::is_same_v<decltype(&Class::name), void(Class::*) arguments>)
 
 static_assert(isSource<KeySource> && isSource<GlobalSource> && isSource<SpeechSource> && isSource<PhoneSource>);
-static_assert(isSource<EAPhoneSource> && isSource<ProjectionSource> && isSource<CDSource> && isSource<MediaAudioSource>);
+static_assert(
+    isSource<EAPhoneSource> && isSource<ProjectionSource> && isSource<CDSource> && isSource<MediaAudioSource>);
 static_assert(isSource<ValetModeSource> && isSource<BezelDiagnosticsSource> && isSource<LanguageModel>);
-static_assert(isSource<AMTunerSource> && isSource<FMTunerSource> && isSource<XMTunerSource> && isSource<DABTunerSource>);
+static_assert(
+    isSource<AMTunerSource> && isSource<FMTunerSource> && isSource<XMTunerSource> && isSource<DABTunerSource>);
 static_assert(std::is_base_of_v<TunerSource, AMTunerSource> && std::is_base_of_v<TunerSource, FMTunerSource>);
 static_assert(std::is_base_of_v<TunerSource, XMTunerSource> && std::is_base_of_v<TunerSource, DABTunerSource>);
-static_assert(isIntEnum<KeySource::KeyState> && isIntEnum<GlobalSource::ALAudioSource> && isIntEnum<GlobalSource::SystemLanguage>);
-static_assert(isIntEnum<TunerSource::CurrentMode> && isIntEnum<XMTunerSource::SeekLongXMStatus> && isIntEnum<CDSource::CDStatus>);
+static_assert(
+    isIntEnum<
+        KeySource::KeyState> && isIntEnum<GlobalSource::ALAudioSource> && isIntEnum<GlobalSource::SystemLanguage>);
+static_assert(
+    isIntEnum<TunerSource::CurrentMode> && isIntEnum<XMTunerSource::SeekLongXMStatus> && isIntEnum<CDSource::CDStatus>);
 
 static_assert(std::is_same_v<decltype(&MessageReceiveThread::createInstance), MessageReceiveThread* (*)(QObject*)>);
-static_assert(std::is_same_v<decltype(&MessageReceivePriorityQueueThread::createInstance), MessageReceivePriorityQueueThread* (*)(QObject*)>);
-static_assert(std::is_base_of_v<QThread, MessageReceiveThread> && std::is_base_of_v<QThread, MessageReceivePriorityQueueThread>);
-static_assert(std::is_base_of_v<QThread, TouchInputReceiverThread> && std::is_constructible_v<TouchInputReceiverThread, QObject*>);
+static_assert(std::is_same_v<decltype(&MessageReceivePriorityQueueThread::createInstance),
+                             MessageReceivePriorityQueueThread* (*)(QObject*)>);
+static_assert(
+    std::is_base_of_v<QThread, MessageReceiveThread> && std::is_base_of_v<QThread, MessageReceivePriorityQueueThread>);
+static_assert(std::is_base_of_v<
+                  QThread, TouchInputReceiverThread> && std::is_constructible_v<TouchInputReceiverThread, QObject*>);
 static_assert(std::is_void_v<decltype(std::declval<MessageReceiveThread&>().begin())>);
 static_assert(std::is_void_v<decltype(std::declval<MessageReceivePriorityQueueThread&>().begin())>);
 static_assert(std::is_void_v<decltype(std::declval<TouchInputReceiverThread&>().begin())>);
 CALL(TouchInputReceiverThread, setPassThroughViewVisible, (bool));
 CALL(TouchInputReceiverThread, setMobileNavTouchParamsOffset, (bool, int, int));
 CALL(TouchInputReceiverThread, passThroughViewTouched, ());
-static_assert(std::is_pointer_v<decltype(HMI2ALMessageSender::instance())> && std::is_pointer_v<decltype(HMI2NAVMessageSender::instance())>);
+static_assert(
+    std::is_pointer_v<
+        decltype(HMI2ALMessageSender::instance())> && std::is_pointer_v<decltype(HMI2NAVMessageSender::instance())>);
 
 CALL(KeySource, keyEvent, (int, int));
 CALL(KeySource, keyComboEvent, (int, int));
@@ -146,8 +159,10 @@ GETTER(ValetModeSource, bool, valetModeEnabled);
 GETTER(BezelDiagnosticsSource, bool, bezelDiagnosticsActive);
 
 static_assert(std::is_base_of_v<QAbstractListModel, LanguageModel>);
-static_assert(std::is_same_v<decltype(&LanguageModel::languageSupported), bool (LanguageModel::*)(GlobalSource::SystemLanguage) const>);
-static_assert(std::is_same_v<decltype(&LanguageModel::localeFromId), QString (LanguageModel::*)(GlobalSource::SystemLanguage) const>);
+static_assert(std::is_same_v<decltype(&LanguageModel::languageSupported),
+                             bool (LanguageModel::*)(GlobalSource::SystemLanguage) const>);
+static_assert(std::is_same_v<decltype(&LanguageModel::localeFromId),
+                             QString (LanguageModel::*)(GlobalSource::SystemLanguage) const>);
 static_assert(std::is_same_v<decltype(&LanguageModel::idForLocale), int (LanguageModel::*)(const QString&) const>);
 
 /// The numbers that other sides know without names.

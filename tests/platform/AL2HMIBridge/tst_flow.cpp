@@ -106,7 +106,8 @@ private Q_SLOTS:
         PeerSocket keys = m_bridge->peer.accept("priority");
         QVERIFY(messages.greetWithSnapshot());
         QVERIFY(keys.greet());
-        QTRY_VERIFY(BridgeFixture::synchronised() && BridgeConnection::instance()->channelConnected(BridgeEndpoint::Priority));
+        QTRY_VERIFY(BridgeFixture::synchronised()
+                    && BridgeConnection::instance()->channelConnected(BridgeEndpoint::Priority));
         constexpr int states = 60000;
         QString atKey;
         int stateChanges = 0;
@@ -122,7 +123,8 @@ private Q_SLOTS:
             QVERIFY(keys.send(keyLine(7)));
             QTimer::singleShot(0, &context, [&] { timerRan = atKey.isEmpty() || stateChanges < states; });
         });
-        connect(KeySource::instance(), &KeySource::keyEvent, &context, [&] { atKey = FMTunerSource::instance()->frequency(); });
+        connect(KeySource::instance(), &KeySource::keyEvent, &context,
+                [&] { atKey = FMTunerSource::instance()->frequency(); });
         std::thread sender([&messages] {
             QByteArray lines;
             for (int i = 1; i <= states; ++i)
@@ -141,12 +143,14 @@ private Q_SLOTS:
     {
         m_bridge->startMessages();
         GlobalSource::instance()->sendShortSeekUp();
-        QVERIFY(m_bridge->log.takeOne(QtWarningMsg, QStringLiteral("Call dropped: GlobalSource.sendShortSeekUp - no peer is connected")));
+        QVERIFY(m_bridge->log.takeOne(
+            QtWarningMsg, QStringLiteral("Call dropped: GlobalSource.sendShortSeekUp - no peer is connected")));
         PeerSocket messages = m_bridge->peer.accept("messages");
         QVERIFY(messages.greetWithSnapshot());
         QTRY_VERIFY(BridgeFixture::synchronised());
         GlobalSource::instance()->requestBeepSound();
-        QCOMPARE(messages.readLine(), QByteArray("{\"args\":[],\"call\":\"requestBeepSound\",\"source\":\"GlobalSource\"}"));
+        QCOMPARE(messages.readLine(),
+                 QByteArray("{\"args\":[],\"call\":\"requestBeepSound\",\"source\":\"GlobalSource\"}"));
     }
 
     void callsLeaveOnlyAfterTheGreeting()
@@ -155,7 +159,8 @@ private Q_SLOTS:
         PeerSocket messages = m_bridge->peer.accept("messages");
         QVERIFY(messages.isOpen());
         GlobalSource::instance()->sendShortSeekUp();
-        QVERIFY(m_bridge->log.takeOne(QtWarningMsg, QStringLiteral("Call dropped: GlobalSource.sendShortSeekUp - no peer is connected")));
+        QVERIFY(m_bridge->log.takeOne(
+            QtWarningMsg, QStringLiteral("Call dropped: GlobalSource.sendShortSeekUp - no peer is connected")));
     }
 
     void aPeerThatDoesNotReadFillsABoundedQueue()
@@ -171,20 +176,23 @@ private Q_SLOTS:
             ++calls;
         }
         QVERIFY(calls > 10 && calls < 100);
-        QCOMPARE(m_bridge->takeWarnings(), QStringList(QStringLiteral("Call dropped: FMTunerSource.tune - too much waits to be sent")));
+        QCOMPARE(m_bridge->takeWarnings(),
+                 QStringList(QStringLiteral("Call dropped: FMTunerSource.tune - too much waits to be sent")));
 
         // what the lost peer did not read is reported once and never reaches the next one
         first.close();
         QTRY_VERIFY(!BridgeFixture::connected());
         const QStringList warnings = m_bridge->takeWarnings();
         QCOMPARE(warnings.size(), 1);
-        const int lost = warnings.constFirst().section(QStringLiteral("before it read "), 1).section(QLatin1Char(' '), 0, 0).toInt();
+        const int lost =
+            warnings.constFirst().section(QStringLiteral("before it read "), 1).section(QLatin1Char(' '), 0, 0).toInt();
         QVERIFY2(lost > 5 && lost < calls, qPrintable(warnings.constFirst()));
         PeerSocket second = m_bridge->peer.accept("messages");
         QVERIFY(second.greetWithSnapshot());
         QTRY_VERIFY(BridgeFixture::synchronised());
         GlobalSource::instance()->requestBeepSound();
-        QCOMPARE(second.readLine(), QByteArray("{\"args\":[],\"call\":\"requestBeepSound\",\"source\":\"GlobalSource\"}"));
+        QCOMPARE(second.readLine(),
+                 QByteArray("{\"args\":[],\"call\":\"requestBeepSound\",\"source\":\"GlobalSource\"}"));
     }
 
     void aSlowPeerGetsAllCallsInOrder()
@@ -208,7 +216,8 @@ private Q_SLOTS:
         QVERIFY(messages.greetWithSnapshot());
         QTRY_VERIFY(BridgeFixture::synchronised());
         FMTunerSource::instance()->tune(QString(1024 * 1024, QLatin1Char('x')), QString());
-        QCOMPARE(m_bridge->takeWarnings(), QStringList(QStringLiteral("Call dropped: FMTunerSource.tune - it is longer than a line may be")));
+        QCOMPARE(m_bridge->takeWarnings(),
+                 QStringList(QStringLiteral("Call dropped: FMTunerSource.tune - it is longer than a line may be")));
         GlobalSource::instance()->requestBeepSound();
         QVERIFY(messages.readLine().contains("requestBeepSound"));
     }

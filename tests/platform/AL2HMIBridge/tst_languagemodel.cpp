@@ -26,7 +26,8 @@ private Q_SLOTS:
 
     void isAProperModel()
     {
-        const QAbstractItemModelTester tester(LanguageModel::instance(), QAbstractItemModelTester::FailureReportingMode::QtTest);
+        const QAbstractItemModelTester tester(LanguageModel::instance(),
+                                              QAbstractItemModelTester::FailureReportingMode::QtTest);
         QVERIFY(LanguageModel::instance()->rowCount() > 0);
         QCOMPARE(LanguageModel::instance()->rowCount(LanguageModel::instance()->index(0)), 0);
     }
@@ -39,11 +40,26 @@ private Q_SLOTS:
         {
             const char* locale;
             const char* name;
-        } rows[] = {{"en_US", "English (US)"}, {"en_GB", "English (UK)"}, {"de_DE", "Deutsch"}, {"fr_FR", "Français"},
-                    {"fr_CA", "Français (Canada)"}, {"es_ES", "Español"}, {"es_MX", "Español (México)"}, {"ar_SA", "العربية"},
-                    {"zh_CN", "简体中文"}, {"zh_TW", "繁體中文"}, {"it_IT", "Italiano"}, {"pt_PT", "Português"},
-                    {"nl_NL", "Nederlands"}, {"pl_PL", "Polski"}, {"ru_RU", "Русский"}, {"tr_TR", "Türkçe"},
-                    {"sv_SE", "Svenska"}, {"cs_CZ", "Čeština"}, {"ja_JP", "日本語"}, {"ko_KR", "한국어"}};
+        } rows[] = {{"en_US", "English (US)"},
+                    {"en_GB", "English (UK)"},
+                    {"de_DE", "Deutsch"},
+                    {"fr_FR", "Français"},
+                    {"fr_CA", "Français (Canada)"},
+                    {"es_ES", "Español"},
+                    {"es_MX", "Español (México)"},
+                    {"ar_SA", "العربية"},
+                    {"zh_CN", "简体中文"},
+                    {"zh_TW", "繁體中文"},
+                    {"it_IT", "Italiano"},
+                    {"pt_PT", "Português"},
+                    {"nl_NL", "Nederlands"},
+                    {"pl_PL", "Polski"},
+                    {"ru_RU", "Русский"},
+                    {"tr_TR", "Türkçe"},
+                    {"sv_SE", "Svenska"},
+                    {"cs_CZ", "Čeština"},
+                    {"ja_JP", "日本語"},
+                    {"ko_KR", "한국어"}};
         for (const auto& row : rows)
             QTest::newRow(row.locale) << QString::fromLatin1(row.locale) << QString::fromUtf8(row.name);
     }

@@ -53,10 +53,12 @@ private Q_SLOTS:
         QTRY_COMPARE(touched.size(), 1);
 
         GlobalSource::instance()->setAudioSource(GlobalSource::AudioNext, -1);
-        QCOMPARE(messages.readLine(), QByteArray("{\"args\":[12,-1],\"call\":\"setAudioSource\",\"source\":\"GlobalSource\"}"));
+        QCOMPARE(messages.readLine(),
+                 QByteArray("{\"args\":[12,-1],\"call\":\"setAudioSource\",\"source\":\"GlobalSource\"}"));
         m_bridge->touch->setMobileNavTouchParamsOffset(true, 3, -4);
-        QCOMPARE(touch.readLine(),
-                 QByteArray("{\"args\":[true,3,-4],\"call\":\"setMobileNavTouchParamsOffset\",\"source\":\"TouchInput\"}"));
+        QCOMPARE(
+            touch.readLine(),
+            QByteArray("{\"args\":[true,3,-4],\"call\":\"setMobileNavTouchParamsOffset\",\"source\":\"TouchInput\"}"));
     }
 
     void createInstanceGivesTheOneThreadThatLives()
@@ -87,7 +89,8 @@ private Q_SLOTS:
         const QString version = QStringLiteral("this side speaks protocol version 1 only");
         QTest::newRow("newer") << QByteArray("{\"protocol\":2,\"peer\":\"application-layer\"}") << version;
         QTest::newRow("text") << QByteArray("{\"protocol\":\"1\",\"peer\":\"application-layer\"}") << version;
-        QTest::newRow("none") << QByteArray("{\"peer\":\"application-layer\"}") << QStringLiteral("\"source\" must be a text");
+        QTest::newRow("none") << QByteArray("{\"peer\":\"application-layer\"}")
+                              << QStringLiteral("\"source\" must be a text");
         QTest::newRow("an HMI") << QByteArray("{\"protocol\":1,\"peer\":\"hmi\"}")
                                 << QStringLiteral("the first line must name the peer \"application-layer\"");
         QTest::newRow("state first") << QByteArray("{\"source\":\"GlobalSource\",\"state\":{\"volume\":3}}")
@@ -106,7 +109,8 @@ private Q_SLOTS:
         PeerSocket right = m_bridge->peer.accept("messages");
         QVERIFY(right.greetWithSnapshot());
         QTRY_VERIFY(BridgeFixture::synchronised());
-        QCOMPARE(m_bridge->takeWarnings(), QStringList(QStringLiteral("Line refused on messages: no greeting: ") + problem));
+        QCOMPARE(m_bridge->takeWarnings(),
+                 QStringList(QStringLiteral("Line refused on messages: no greeting: ") + problem));
         QCOMPARE(GlobalSource::instance()->volume(), 0);
     }
 
@@ -125,8 +129,10 @@ private Q_SLOTS:
         QTest::addColumn<int>("mode");
         QTest::addColumn<bool>("link");
         QTest::addColumn<QString>("problem");
-        QTest::newRow("others may enter") << 0701 << false << QStringLiteral("other users may enter it; its mode must be 0700");
-        QTest::newRow("group may read") << 0740 << false << QStringLiteral("other users may enter it; its mode must be 0700");
+        QTest::newRow("others may enter")
+            << 0701 << false << QStringLiteral("other users may enter it; its mode must be 0700");
+        QTest::newRow("group may read") << 0740 << false
+                                        << QStringLiteral("other users may enter it; its mode must be 0700");
         QTest::newRow("link") << 0700 << true << QStringLiteral("it is not a directory that can be opened");
     }
 
@@ -146,7 +152,8 @@ private Q_SLOTS:
         QTRY_VERIFY(!m_bridge->log.messages(QStringLiteral("al2hmi.bridge"), QtWarningMsg).isEmpty());
         QVERIFY(!QTest::qWaitFor([] { return BridgeFixture::connected(); }, 300)); // several attempts, one warning
         QFETCH(QString, problem);
-        QCOMPARE(m_bridge->takeWarnings(), QStringList(QStringLiteral("Socket directory %1 refused: %2").arg(directory, problem)));
+        QCOMPARE(m_bridge->takeWarnings(),
+                 QStringList(QStringLiteral("Socket directory %1 refused: %2").arg(directory, problem)));
 
         QCOMPARE(::chmod(QFile::encodeName(m_bridge->peer.directory()).constData(), 0700), 0);
         BridgeEndpoint::setDirectory(m_bridge->peer.directory());
@@ -169,7 +176,8 @@ private Q_SLOTS:
             qstrncpy(address.sun_path, path.constData(), sizeof address.sun_path);
             const int listener = ::socket(AF_UNIX, SOCK_STREAM, 0);
             const bool listens = ::bind(listener, reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0
-                && ::setuid(65534) == 0 && ::listen(listener, 8) == 0; // listening is what leaves the identity
+                                 && ::setuid(65534) == 0
+                                 && ::listen(listener, 8) == 0; // listening is what leaves the identity
             const char told = listens ? 'y' : 'n';
             if (::write(started[1], &told, 1) == 1)
                 ::pause();
@@ -181,13 +189,15 @@ private Q_SLOTS:
         ::close(started[1]);
         m_bridge->startMessages();
         const bool warned = QTest::qWaitFor(
-            [this] { return !m_bridge->log.messages(QStringLiteral("al2hmi.bridge"), QtWarningMsg).isEmpty(); }, FakePeer::deadline);
+            [this] { return !m_bridge->log.messages(QStringLiteral("al2hmi.bridge"), QtWarningMsg).isEmpty(); },
+            FakePeer::deadline);
         ::kill(child, SIGKILL);
         ::waitpid(child, nullptr, 0);
         QCOMPARE(told, 'y');
         QVERIFY(warned);
         QVERIFY(!BridgeFixture::connected());
-        QCOMPARE(m_bridge->takeWarnings(), QStringList(QStringLiteral("Peer on messages refused: it is run by another user")));
+        QCOMPARE(m_bridge->takeWarnings(),
+                 QStringList(QStringLiteral("Peer on messages refused: it is run by another user")));
     }
 
     void snapshotIsAppliedAtOnce()

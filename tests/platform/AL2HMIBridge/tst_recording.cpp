@@ -65,7 +65,8 @@ private Q_SLOTS:
             QCOMPARE(recorder.droppedLines(), 0);
             QCOMPARE(bridge.takeWarnings().size(), 1);
         }
-        struct stat status{};
+        struct stat status
+        {};
         QCOMPARE(::stat(QFile::encodeName(fileName).constData(), &status), 0);
         QCOMPARE(status.st_mode & 0777, mode_t(0600));
 
@@ -93,7 +94,7 @@ private Q_SLOTS:
         QCOMPARE(GlobalSource::instance()->volume(), 5);
         QCOMPARE(FMTunerSource::instance()->stationName(), QStringLiteral("Größe"));
         QCOMPARE(keyEvents.takeFirst(), QVariantList({7, 3}));
-        QCOMPARE(connected.size(), 2); // it came and went
+        QCOMPARE(connected.size(), 2);                                               // it came and went
         QCOMPARE(log.take(QStringLiteral("al2hmi.bridge"), QtWarningMsg).size(), 1); // the garbage again
     }
 
@@ -102,8 +103,10 @@ private Q_SLOTS:
         const LogCapture log;
         const QTemporaryDir directory;
         const QString fileName = directory.filePath(QStringLiteral("pace.jsonl"));
-        write(fileName, "{\"t\":100.0,\"channel\":\"messages\",\"direction\":\"in\",\"line\":{\"source\":\"GlobalSource\",\"state\":{\"volume\":1}}}\n"
-                        "{\"t\":104.0,\"channel\":\"messages\",\"direction\":\"in\",\"line\":{\"source\":\"GlobalSource\",\"state\":{\"volume\":2}}}\n");
+        write(
+            fileName,
+            "{\"t\":100.0,\"channel\":\"messages\",\"direction\":\"in\",\"line\":{\"source\":\"GlobalSource\",\"state\":{\"volume\":1}}}\n"
+            "{\"t\":104.0,\"channel\":\"messages\",\"direction\":\"in\",\"line\":{\"source\":\"GlobalSource\",\"state\":{\"volume\":2}}}\n");
         BridgeTester::resetState();
         BridgePlayer player;
         QVERIFY2(player.load(fileName), qPrintable(player.errorString()));
@@ -122,8 +125,10 @@ private Q_SLOTS:
         const LogCapture log;
         const QTemporaryDir directory;
         const QString fileName = directory.filePath(QStringLiteral("stop.jsonl"));
-        write(fileName, "{\"t\":0,\"channel\":\"messages\",\"direction\":\"in\",\"line\":{\"source\":\"GlobalSource\",\"state\":{\"volume\":1}}}\n"
-                        "{\"t\":1,\"channel\":\"messages\",\"direction\":\"in\",\"line\":{\"source\":\"GlobalSource\",\"state\":{\"volume\":2}}}\n");
+        write(
+            fileName,
+            "{\"t\":0,\"channel\":\"messages\",\"direction\":\"in\",\"line\":{\"source\":\"GlobalSource\",\"state\":{\"volume\":1}}}\n"
+            "{\"t\":1,\"channel\":\"messages\",\"direction\":\"in\",\"line\":{\"source\":\"GlobalSource\",\"state\":{\"volume\":2}}}\n");
         BridgeTester::resetState();
         BridgePlayer player;
         QVERIFY(!player.play());
@@ -145,7 +150,9 @@ private Q_SLOTS:
         QTest::addColumn<QString>("problem");
         const QString time = QStringLiteral("\"t\" must be a time not before the line above");
         QTest::newRow("no time") << QByteArray("{\"channel\":\"touch\",\"direction\":\"in\",\"line\":{}}") << time;
-        QTest::newRow("time runs back") << QByteArray("{\"t\":0.5,\"channel\":\"touch\",\"direction\":\"in\",\"line\":{}}") << time;
+        QTest::newRow("time runs back") << QByteArray(
+            "{\"t\":0.5,\"channel\":\"touch\",\"direction\":\"in\",\"line\":{}}")
+                                        << time;
         QTest::newRow("channel") << QByteArray("{\"t\":2,\"channel\":\"side\",\"direction\":\"in\",\"line\":{}}")
                                  << QStringLiteral("\"channel\" must be messages, priority or touch");
         QTest::newRow("direction") << QByteArray("{\"t\":2,\"channel\":\"touch\",\"direction\":\"up\",\"line\":{}}")
@@ -172,7 +179,8 @@ private Q_SLOTS:
         const QTemporaryDir directory;
         BridgePlayer player;
         QVERIFY(!player.load(directory.filePath(QStringLiteral("missing"))));
-        QCOMPARE(player.errorString(), directory.filePath(QStringLiteral("missing")) + QStringLiteral(": not a regular file"));
+        QCOMPARE(player.errorString(),
+                 directory.filePath(QStringLiteral("missing")) + QStringLiteral(": not a regular file"));
         BridgeRecorder recorder;
         QVERIFY(!recorder.start(directory.path()));
         QCOMPARE(recorder.errorString(), directory.path() + QStringLiteral(": not a regular file"));

@@ -67,7 +67,8 @@ private Q_SLOTS:
                 writer.add(BridgeEndpoint::Messages, Direction::In, line, true);
             QCOMPARE(writer.dropped(), 12);
             allowed.release();
-            QTRY_VERIFY(QFileInfo(m_directory.filePath(QStringLiteral("slow.jsonl"))).size() > 8000000); // the eight that fitted
+            QTRY_VERIFY(QFileInfo(m_directory.filePath(QStringLiteral("slow.jsonl"))).size()
+                        > 8000000); // the eight that fitted
             writer.add(BridgeEndpoint::Priority, Direction::Out, "{}\n", true);
         }
         QVERIFY(log.takeOne(QtWarningMsg, QStringLiteral("The recording cannot keep up; lines are left out")));
@@ -94,7 +95,8 @@ private Q_SLOTS:
         }
         const QStringList warnings = log.take(QStringLiteral("al2hmi.bridge"), QtWarningMsg);
         QCOMPARE(warnings.size(), 1);
-        QVERIFY2(warnings.constFirst().startsWith(QStringLiteral("The recording ends early: ")), qPrintable(warnings.constFirst()));
+        QVERIFY2(warnings.constFirst().startsWith(QStringLiteral("The recording ends early: ")),
+                 qPrintable(warnings.constFirst()));
     }
 };
 

@@ -55,7 +55,8 @@ private:
         QTest::addColumn<QJsonObject>("field");
         for (int i = 0; i < m_table.size(); ++i)
             for (const QJsonValue field : m_table.at(i).state)
-                QTest::newRow(qPrintable(m_table.at(i).name + QLatin1Char('.') + nameOf(field))) << i << field.toObject();
+                QTest::newRow(qPrintable(m_table.at(i).name + QLatin1Char('.') + nameOf(field)))
+                    << i << field.toObject();
     }
 
     static QMetaMethod findMethod(const QObject* source, const QString& name)
@@ -93,7 +94,8 @@ private Q_SLOTS:
         QFETCH(int, row);
         QObject* const source = m_table.at(row).instance();
         QVERIFY(source);
-        QCOMPARE(QString::fromLatin1(source->metaObject()->className()), QStringLiteral("AL2HMIBridge::") + m_table.at(row).name);
+        QCOMPARE(QString::fromLatin1(source->metaObject()->className()),
+                 QStringLiteral("AL2HMIBridge::") + m_table.at(row).name);
         QCOMPARE(source, m_table.at(row).instance());
         QCOMPARE(source->parent(), QCoreApplication::instance());
     }
@@ -112,7 +114,8 @@ private Q_SLOTS:
             const QJsonValue sample = source.sample(field, salt);
             const bool differs = sample != valueOf(object, name);
             const QMetaObject* const meta = object->metaObject();
-            QSignalSpy changed(object, meta->property(meta->indexOfProperty(name.toLatin1().constData())).notifySignal());
+            QSignalSpy changed(object,
+                               meta->property(meta->indexOfProperty(name.toLatin1().constData())).notifySignal());
             QVERIFY(changed.isValid());
             QVERIFY(BridgeTester::setState(source.name, {{name, sample.toVariant()}}));
             QCOMPARE(valueOf(object, name), sample);
@@ -138,7 +141,8 @@ private Q_SLOTS:
             QVERIFY(!BridgeTester::setState(source.name, {{name, value}}));
             const QStringList warnings = m_log->take(QStringLiteral("al2hmi.bridge"), QtWarningMsg);
             QCOMPARE(warnings.size(), 1);
-            QVERIFY2(warnings.constFirst().startsWith(QStringLiteral("Line refused on messages: %1.%2: ").arg(source.name, name)),
+            QVERIFY2(warnings.constFirst().startsWith(
+                         QStringLiteral("Line refused on messages: %1.%2: ").arg(source.name, name)),
                      qPrintable(warnings.constFirst()));
         }
         QCOMPARE(valueOf(source.instance(), name), source.initial(field));
@@ -219,14 +223,16 @@ private Q_SLOTS:
         QObject context;
         connect(fm, &FMTunerSource::frequencyChanged, &context, look);
         connect(fm, &FMTunerSource::stationNameChanged, &context, look);
-        QVERIFY(BridgeTester::setState("FMTunerSource", {{"stationName", QStringLiteral("North")}, {"frequency", QStringLiteral("98.5")}}));
+        QVERIFY(BridgeTester::setState(
+            "FMTunerSource", {{"stationName", QStringLiteral("North")}, {"frequency", QStringLiteral("98.5")}}));
         QCOMPARE(seen, QStringList({QStringLiteral("98.5 North"), QStringLiteral("98.5 North")}));
     }
 
     void oneWrongFieldRefusesTheWholeMessage()
     {
         QVERIFY(!BridgeTester::setState("GlobalSource", {{"destinationCountry", 5}, {"muted", true}, {"volume", 41}}));
-        QVERIFY(m_log->takeOne(QtWarningMsg, QStringLiteral("Line refused on messages: GlobalSource.volume: 41 is out of range")));
+        QVERIFY(m_log->takeOne(QtWarningMsg,
+                               QStringLiteral("Line refused on messages: GlobalSource.volume: 41 is out of range")));
         QCOMPARE(GlobalSource::instance()->destinationCountry(), 0);
         QCOMPARE(GlobalSource::instance()->muted(), false);
     }

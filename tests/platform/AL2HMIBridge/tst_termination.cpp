@@ -11,7 +11,12 @@ class TerminationTest : public QObject
     Q_OBJECT
 
 private:
-    static int openDescriptors() { return int(QDir(QStringLiteral("/proc/self/fd")).entryList(QDir::NoDotAndDotDot | QDir::AllEntries | QDir::System).size()); }
+    static int openDescriptors()
+    {
+        return int(QDir(QStringLiteral("/proc/self/fd"))
+                       .entryList(QDir::NoDotAndDotDot | QDir::AllEntries | QDir::System)
+                       .size());
+    }
 
     static bool end(QThread* thread)
     {

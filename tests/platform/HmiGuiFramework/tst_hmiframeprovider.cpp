@@ -45,7 +45,8 @@ private Q_SLOTS:
         HmiFrameProvider::setFrame(QStringLiteral("cover"), filled(QSize(100, 100), Qt::red));
         provider.requestImage(QStringLiteral("cover"), nullptr, QSize(10, 10));
         HmiFrameProvider::setFrame(QStringLiteral("cover"), filled(QSize(100, 100), Qt::blue));
-        QCOMPARE(provider.requestImage(QStringLiteral("cover"), nullptr, QSize(10, 10)).pixelColor(5, 5), QColor(Qt::blue));
+        QCOMPARE(provider.requestImage(QStringLiteral("cover"), nullptr, QSize(10, 10)).pixelColor(5, 5),
+                 QColor(Qt::blue));
     }
 
     void anUnknownNameIsATransparentPixel()

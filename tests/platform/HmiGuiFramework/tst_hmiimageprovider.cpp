@@ -56,7 +56,8 @@ private Q_SLOTS:
         QTest::addColumn<QString>("warning");
         QTest::newRow("unknown") << QStringLiteral("nothing") << QStringLiteral("icon nothing does not exist");
         QTest::newRow("no name") << QString() << QStringLiteral("icon  does not exist");
-        QTest::newRow("outside of the folder") << QStringLiteral("../gui/data/views") << QStringLiteral("icon ../gui/data/views does not exist");
+        QTest::newRow("outside of the folder")
+            << QStringLiteral("../gui/data/views") << QStringLiteral("icon ../gui/data/views does not exist");
         QTest::newRow("not a picture") << QStringLiteral("broken") << QStringLiteral("icon broken cannot be drawn");
     }
 

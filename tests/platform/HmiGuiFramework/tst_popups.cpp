@@ -118,7 +118,8 @@ private Q_SLOTS:
         QTest::addColumn<QString>("reason");
         QTest::newRow("unknown") << text("Nothing") << text("there is no such popup");
         QTest::newRow("a view") << text("M.Main") << text("there is no such popup");
-        QTest::newRow("without a state") << text("M.StatelessPopup") << text("the popup has no popup state of its name");
+        QTest::newRow("without a state") << text("M.StatelessPopup")
+                                         << text("the popup has no popup state of its name");
         QTest::newRow("cannot be created") << text("M.BrokenPopup") << text("qrc:/gui/data/Broken.qml:5");
     }
 

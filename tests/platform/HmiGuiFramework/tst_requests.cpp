@@ -64,8 +64,10 @@ private Q_SLOTS:
         QVERIFY(gui.start());
         QStringList shown;
         connect(&gui.views, &ViewManager::viewShown, this, [&](const QString& name) { shown.append(name); });
-        FrameworkTester::hmiViewBatchRequest({QStringLiteral("M.List"), QStringLiteral("Nowhere"), QStringLiteral("M.Main"), QStringLiteral("M.Home")});
-        QTRY_COMPARE(shown, QStringList({QStringLiteral("M.List"), QStringLiteral("M.Main"), QStringLiteral("M.Home")}));
+        FrameworkTester::hmiViewBatchRequest(
+            {QStringLiteral("M.List"), QStringLiteral("Nowhere"), QStringLiteral("M.Main"), QStringLiteral("M.Home")});
+        QTRY_COMPARE(shown,
+                     QStringList({QStringLiteral("M.List"), QStringLiteral("M.Main"), QStringLiteral("M.Home")}));
         QVERIFY(gui.warned("request for \"Nowhere\" refused: there is no such view or state"));
     }
 
@@ -77,8 +79,10 @@ private Q_SLOTS:
         FrameworkTester::hmiPopupRequest(QStringLiteral("M.Note"));
         FrameworkTester::hmiPopupBatchRequest({});
         QCOMPARE(log.take(QStringLiteral("hmi.gui"), QtWarningMsg),
-                 QStringList({QStringLiteral("hmiViewRequest: there is no view manager"), QStringLiteral("hmiViewBatchRequest: there is no view manager"),
-                              QStringLiteral("hmiPopupRequest: there is no view manager"), QStringLiteral("hmiPopupBatchRequest: there is no view manager")}));
+                 QStringList({QStringLiteral("hmiViewRequest: there is no view manager"),
+                              QStringLiteral("hmiViewBatchRequest: there is no view manager"),
+                              QStringLiteral("hmiPopupRequest: there is no view manager"),
+                              QStringLiteral("hmiPopupBatchRequest: there is no view manager")}));
     }
 };
 

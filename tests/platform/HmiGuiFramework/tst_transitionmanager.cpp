@@ -43,7 +43,8 @@ private Q_SLOTS:
         QTest::newRow("forward, reversed") << QStringLiteral("slide-forward") << true << false << -200. << 1.;
         QTest::newRow("forward, right to left") << QStringLiteral("slide-forward") << false << true << -200. << 1.;
         QTest::newRow("backward") << QStringLiteral("slide-backward") << false << false << -200. << 1.;
-        QTest::newRow("backward, reversed, right to left") << QStringLiteral("slide-backward") << true << true << -200. << 1.;
+        QTest::newRow("backward, reversed, right to left")
+            << QStringLiteral("slide-backward") << true << true << -200. << 1.;
         QTest::newRow("fade") << QStringLiteral("fade") << false << false << 0. << 0.;
         QTest::newRow("default is fade") << QString() << true << true << 0. << 0.;
     }

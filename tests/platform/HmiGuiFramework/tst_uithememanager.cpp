@@ -34,8 +34,9 @@ class UiThemeManagerTest : public QObject
 
         bool loadGood()
         {
-            return manager.loadTheme(write(R"({"palettes": {"day": {"surface": "white"}, "night": {"surface": "black"}}, "defaultPalette": "day",)"
-                                           R"("values": {"gap": 16, "font": "Inter"}})"));
+            return manager.loadTheme(write(
+                R"({"palettes": {"day": {"surface": "white"}, "night": {"surface": "black"}}, "defaultPalette": "day",)"
+                R"("values": {"gap": 16, "font": "Inter"}})"));
         }
 
         QColor surface() { return manager.colors()->value(QStringLiteral("surface")).value<QColor>(); }
@@ -97,7 +98,8 @@ private Q_SLOTS:
         Themes themes;
         QVERIFY(themes.loadGood());
         themes.manager.setPalette(text("night"));
-        QVERIFY(themes.manager.loadTheme(themes.write(R"({"palettes": {"day": {"surface": "red"}, "night": {"surface": "blue"}}})")));
+        QVERIFY(themes.manager.loadTheme(
+            themes.write(R"({"palettes": {"day": {"surface": "red"}, "night": {"surface": "blue"}}})")));
         QCOMPARE(themes.manager.palette(), text("night"));
         QCOMPARE(themes.surface(), QColor(Qt::blue));
         QVERIFY(themes.manager.loadTheme(themes.write(R"({"palettes": {"dusk": {"surface": "lime"}}})")));
@@ -110,12 +112,15 @@ private Q_SLOTS:
         QDir(themes.folder.path()).mkdir(text("icons"));
         QFile icon(themes.folder.filePath(text("icons/dot.svg")));
         QVERIFY(icon.open(QIODevice::WriteOnly));
-        icon.write("<svg xmlns='http://www.w3.org/2000/svg' width='8' height='8'><rect width='8' height='8' fill='currentColor'/></svg>");
+        icon.write(
+            "<svg xmlns='http://www.w3.org/2000/svg' width='8' height='8'><rect width='8' height='8' fill='currentColor'/></svg>");
         icon.close();
         HmiGuiFramework::AppSettings::mainFolderPath = themes.folder.path() + QLatin1Char('/');
         QVERIFY(themes.loadGood());
         HmiGuiFramework::HmiImageProvider provider;
-        const auto color = [&] { return provider.requestImage(text("dot?color=surface"), nullptr, QSize()).pixelColor(4, 4); };
+        const auto color = [&] {
+            return provider.requestImage(text("dot?color=surface"), nullptr, QSize()).pixelColor(4, 4);
+        };
         connect(&themes.manager, &UiThemeManager::paletteChange, this, [&] { provider.clearCache(); });
         QCOMPARE(color(), QColor(Qt::white));
         themes.manager.setPalette(text("night"));
@@ -128,13 +133,23 @@ private Q_SLOTS:
         QTest::addColumn<QByteArray>("content");
         QTest::addColumn<QString>("error");
         QTest::newRow("not JSON") << QByteArray("{\n\n") << text("line 3: ");
-        QTest::newRow("no palettes") << QByteArray("{}") << text("palettes: must be an object with at least one palette");
-        QTest::newRow("palettes empty") << QByteArray(R"({"palettes": {}})") << text("palettes: must be an object with at least one palette");
-        QTest::newRow("palette empty") << QByteArray(R"({"palettes": {"day": {}}})") << text("palettes.day: must give a colour to the same roles as the other palettes");
-        QTest::newRow("not a colour") << QByteArray(R"({"palettes": {"day": {"surface": "whitish"}}})") << text("palettes.day.surface: is not a colour");
-        QTest::newRow("roles differ") << QByteArray(R"({"palettes": {"day": {"a": "white"}, "night": {"b": "black"}}})") << text("palettes.night: must give a colour to the same roles as the other palettes");
-        QTest::newRow("default palette") << QByteArray(R"({"palettes": {"day": {"a": "white"}}, "defaultPalette": "x"})") << text("defaultPalette: there is no palette \"x\"");
-        QTest::newRow("value") << QByteArray(R"({"palettes": {"day": {"a": "white"}}, "values": {"gap": []}})") << text("values.gap: must be a number or a string");
+        QTest::newRow("no palettes") << QByteArray("{}")
+                                     << text("palettes: must be an object with at least one palette");
+        QTest::newRow("palettes empty") << QByteArray(R"({"palettes": {}})")
+                                        << text("palettes: must be an object with at least one palette");
+        QTest::newRow("palette empty")
+            << QByteArray(R"({"palettes": {"day": {}}})")
+            << text("palettes.day: must give a colour to the same roles as the other palettes");
+        QTest::newRow("not a colour") << QByteArray(R"({"palettes": {"day": {"surface": "whitish"}}})")
+                                      << text("palettes.day.surface: is not a colour");
+        QTest::newRow("roles differ")
+            << QByteArray(R"({"palettes": {"day": {"a": "white"}, "night": {"b": "black"}}})")
+            << text("palettes.night: must give a colour to the same roles as the other palettes");
+        QTest::newRow("default palette") << QByteArray(
+            R"({"palettes": {"day": {"a": "white"}}, "defaultPalette": "x"})")
+                                         << text("defaultPalette: there is no palette \"x\"");
+        QTest::newRow("value") << QByteArray(R"({"palettes": {"day": {"a": "white"}}, "values": {"gap": []}})")
+                               << text("values.gap: must be a number or a string");
     }
 
     void aFaultyThemeIsRefusedWithTheFieldAndChangesNothing()

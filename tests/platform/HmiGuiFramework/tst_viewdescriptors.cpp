@@ -61,7 +61,8 @@ private Q_SLOTS:
         const QString path = loader.write(R"({"version": 1, "views": [{"name": "Plain", "url": "A.qml"}]})");
         loader.views.loadModule(path, QString(), 0);
         QCOMPARE(loader.views.guiDescriptor().views.keys(), QStringList{text("Plain")});
-        QCOMPARE(loader.views.guiDescriptor().views.value(text("Plain")).url, QUrl::fromLocalFile(loader.folder.filePath(text("A.qml"))));
+        QCOMPARE(loader.views.guiDescriptor().views.value(text("Plain")).url,
+                 QUrl::fromLocalFile(loader.folder.filePath(text("A.qml"))));
     }
 
     void pathsMayBeResourcesOrRelativeToTheMainFolder()
@@ -90,18 +91,30 @@ private Q_SLOTS:
         row("url missing", R"("views": [{"name": "X"}, %1])", "views[0].url: is missing");
         row("url of wrong type", R"("views": [{"name": "X", "url": []}, %1])", "views[0].url: must be a string");
         row("url empty", R"("views": [{"name": "X", "url": ""}, %1])", "views[0].url: must name a QML file");
-        row("file missing", R"("views": [{"name": "X", "url": "C.qml"}, %1])", "views[0].url: the file \"C.qml\" does not exist");
-        row("transition", R"("views": [{"name": "X", "url": "A.qml", "transition": "boom"}, %1])", "views[0].transition: there is no transition \"boom\"");
-        row("keepAlive", R"("views": [{"name": "X", "url": "A.qml", "keepAlive": 1}, %1])", "views[0].keepAlive: must be true or false");
-        row("unknown field", R"("views": [{"name": "X", "url": "A.qml", "colour": 1}, %1])", "views[0].colour: is not a known field");
-        row("variations", R"("views": [{"name": "X", "url": "A.qml", "variations": 1}, %1])", "views[0].variations: must be an object of file by variation");
-        row("variation's file", R"("views": [{"name": "X", "url": "A.qml", "variations": {"c": "C.qml"}}, %1])", "views[0].variations.c: the file \"C.qml\" does not exist");
-        row("priority too large", R"("views": [%1], "popups": [{"name": "X", "url": "A.qml", "priority": 101}])", "popups[0].priority: must be a whole number from 0 to 100");
-        row("priority with a fraction", R"("views": [%1], "popups": [{"name": "X", "url": "A.qml", "priority": 1.5}])", "popups[0].priority: must be a whole number from 0 to 100");
-        row("priority of wrong type", R"("views": [%1], "popups": [{"name": "X", "url": "A.qml", "priority": "1"}])", "popups[0].priority: must be a whole number from 0 to 100");
-        row("timeout negative", R"("views": [%1], "popups": [{"name": "X", "url": "A.qml", "timeout": -1}])", "popups[0].timeout: must be a whole number from 0 to 3600000");
-        row("transient without component", R"("views": [%1], "transients": [{"name": "X"}])", "transients[0].component: is missing");
-        row("component without key", R"("views": [%1], "components": [{"url": "A.qml"}])", "components[0].key: is missing");
+        row("file missing", R"("views": [{"name": "X", "url": "C.qml"}, %1])",
+            "views[0].url: the file \"C.qml\" does not exist");
+        row("transition", R"("views": [{"name": "X", "url": "A.qml", "transition": "boom"}, %1])",
+            "views[0].transition: there is no transition \"boom\"");
+        row("keepAlive", R"("views": [{"name": "X", "url": "A.qml", "keepAlive": 1}, %1])",
+            "views[0].keepAlive: must be true or false");
+        row("unknown field", R"("views": [{"name": "X", "url": "A.qml", "colour": 1}, %1])",
+            "views[0].colour: is not a known field");
+        row("variations", R"("views": [{"name": "X", "url": "A.qml", "variations": 1}, %1])",
+            "views[0].variations: must be an object of file by variation");
+        row("variation's file", R"("views": [{"name": "X", "url": "A.qml", "variations": {"c": "C.qml"}}, %1])",
+            "views[0].variations.c: the file \"C.qml\" does not exist");
+        row("priority too large", R"("views": [%1], "popups": [{"name": "X", "url": "A.qml", "priority": 101}])",
+            "popups[0].priority: must be a whole number from 0 to 100");
+        row("priority with a fraction", R"("views": [%1], "popups": [{"name": "X", "url": "A.qml", "priority": 1.5}])",
+            "popups[0].priority: must be a whole number from 0 to 100");
+        row("priority of wrong type", R"("views": [%1], "popups": [{"name": "X", "url": "A.qml", "priority": "1"}])",
+            "popups[0].priority: must be a whole number from 0 to 100");
+        row("timeout negative", R"("views": [%1], "popups": [{"name": "X", "url": "A.qml", "timeout": -1}])",
+            "popups[0].timeout: must be a whole number from 0 to 3600000");
+        row("transient without component", R"("views": [%1], "transients": [{"name": "X"}])",
+            "transients[0].component: is missing");
+        row("component without key", R"("views": [%1], "components": [{"url": "A.qml"}])",
+            "components[0].key: is missing");
         row("section not an array", R"("views": [%1], "popups": {})", "popups: must be an array");
         row("unknown section", R"("views": [%1], "widgets": [])", "widgets: is not a known field");
         row("shell missing", R"("views": [%1], "shell": "C.qml")", "shell: the file \"C.qml\" does not exist");
@@ -124,8 +137,10 @@ private Q_SLOTS:
     /// An entry with a value for every field that the schema knows.
     static QJsonObject entryFromSchema(const QJsonObject& definition)
     {
-        const QHash<QString, QJsonValue> byReference{{text("#/definitions/name"), text("X")}, {text("#/definitions/url"), text("A.qml")},
-                                                     {text("#/definitions/variations"), QJsonObject{{text("c"), text("B.qml")}}}};
+        const QHash<QString, QJsonValue> byReference{
+            {text("#/definitions/name"), text("X")},
+            {text("#/definitions/url"), text("A.qml")},
+            {text("#/definitions/variations"), QJsonObject{{text("c"), text("B.qml")}}}};
         QJsonObject entry;
         const QJsonObject properties = definition.value(text("properties")).toObject();
         for (auto property = properties.begin(); property != properties.end(); ++property) {
@@ -160,11 +175,13 @@ private Q_SLOTS:
         const QJsonObject entry = entryFromSchema(definitions.value(section.chopped(1)).toObject());
         QVERIFY(entry.size() >= 2);
         Loader loader;
-        const QString path = loader.write(QJsonDocument(QJsonObject{{text("version"), 1}, {section, QJsonArray{entry}}}).toJson());
+        const QString path =
+            loader.write(QJsonDocument(QJsonObject{{text("version"), 1}, {section, QJsonArray{entry}}}).toJson());
         loader.views.loadModule(path, text("P"), 0);
         QCOMPARE(loader.warnings(), QStringList());
         QCOMPARE(loader.views.guiDescriptor().views.size() + loader.views.guiDescriptor().popups.size()
-                     + loader.views.transients().transients.size() + loader.views.transients().components.size(), 1);
+                     + loader.views.transients().transients.size() + loader.views.transients().components.size(),
+                 1);
     }
 
     void anUnusableDescriptorGivesOneWarningAndLoadsNothing_data()
@@ -188,7 +205,8 @@ private Q_SLOTS:
         loader.views.loadModule(path, text("P"), 0);
         const QStringList warnings = loader.warnings();
         QCOMPARE(warnings.size(), 1);
-        QVERIFY2(warnings.at(0).startsWith(text("view descriptor %1: %2").arg(path, error)), qPrintable(warnings.at(0)));
+        QVERIFY2(warnings.at(0).startsWith(text("view descriptor %1: %2").arg(path, error)),
+                 qPrintable(warnings.at(0)));
         QVERIFY(loader.views.guiDescriptor().views.isEmpty());
     }
 
@@ -200,15 +218,17 @@ private Q_SLOTS:
         const QString missing = loader.folder.filePath(text("missing.json"));
         for (const QString& path : {pipe, loader.folder.path(), missing})
             loader.views.loadModule(path, text("P"), 0);
-        QCOMPARE(loader.warnings(), QStringList({text("view descriptor %1: it is not a regular file").arg(pipe),
-                                                 text("view descriptor %1: it is not a regular file").arg(loader.folder.path()),
-                                                 text("view descriptor %1: the file does not exist").arg(missing)}));
+        QCOMPARE(loader.warnings(),
+                 QStringList({text("view descriptor %1: it is not a regular file").arg(pipe),
+                              text("view descriptor %1: it is not a regular file").arg(loader.folder.path()),
+                              text("view descriptor %1: the file does not exist").arg(missing)}));
     }
 
     void aNameThatIsLoadedAlreadyStaysAsItWas()
     {
         Loader loader;
-        const QString path = loader.write(R"({"version": 1, "views": [{"name": "V", "url": "A.qml"}, {"name": "V", "url": "B.qml"}]})");
+        const QString path =
+            loader.write(R"({"version": 1, "views": [{"name": "V", "url": "A.qml"}, {"name": "V", "url": "B.qml"}]})");
         loader.views.loadModule(path, text("P"), 0);
         QCOMPARE(loader.warnings(), QStringList{text("%1 view P.V is loaded already; the first one stays").arg(path)});
         QVERIFY(loader.views.guiDescriptor().views.value(text("P.V")).url.toString().endsWith(text("A.qml")));

@@ -60,7 +60,8 @@ private Q_SLOTS:
         QTest::addColumn<QString>("reason");
         QTest::newRow("unknown") << text("Nowhere") << QString() << text("there is no such view or state");
         QTest::newRow("empty") << QString() << QString() << text("there is no such view or state");
-        QTest::newRow("view without a state") << text("M.Stateless") << QString() << text("the view has no state of its name");
+        QTest::newRow("view without a state")
+            << text("M.Stateless") << QString() << text("the view has no state of its name");
         QTest::newRow("state without a view") << text("M.Bare") << QString() << text("the state leads to no view");
         QTest::newRow("faulty QML") << text("M.Broken") << QString() << text("qrc:/gui/data/Broken.qml:5");
         QTest::newRow("not an item") << text("M.NotAnItem") << QString() << text("its root is not an item");
@@ -105,7 +106,9 @@ private Q_SLOTS:
         gui.machine->requestState(text("M.Broken"));
         QVERIFY(gui.becomesActive("M.Broken"));
         QTRY_COMPARE(gui.log.messages(text("hmi.gui"), QtWarningMsg).size(), 1);
-        QVERIFY(gui.log.take(text("hmi.gui"), QtWarningMsg).at(0).startsWith(text("view M.Broken cannot be created: qrc:/gui/data/Broken.qml:5")));
+        QVERIFY(gui.log.take(text("hmi.gui"), QtWarningMsg)
+                    .at(0)
+                    .startsWith(text("view M.Broken cannot be created: qrc:/gui/data/Broken.qml:5")));
         QCOMPARE(gui.views.currentView(), text("M.Home"));
         QVERIFY(gui.go("M.List"));
     }
@@ -184,7 +187,8 @@ private Q_SLOTS:
         QSignalSpy changed(&gui.views, &ViewManager::uiVariationChanged);
         AppSettings::instance()->setUiVariation(text("compact"));
         QCOMPARE(changed.count(), 1);
-        QCOMPARE(gui.views.guiDescriptor().views.value(text("M.Main")).url, QUrl(text("qrc:/gui/data/ViewCompact.qml")));
+        QCOMPARE(gui.views.guiDescriptor().views.value(text("M.Main")).url,
+                 QUrl(text("qrc:/gui/data/ViewCompact.qml")));
         QCOMPARE(gui.views.guiDescriptor().views.value(text("M.List")).url, QUrl(text("qrc:/gui/data/View.qml")));
         QVERIFY(gui.views.currentItem()->property("compact").toBool());
     }
@@ -215,7 +219,9 @@ private Q_SLOTS:
         QCOMPARE(gui.views.currentItem()->size(), QSizeF(800, 400));
         gui.views.requestPopup(text("M.Call"));
         const auto* const popups = gui.views.stage()->findChild<QQuickItem*>(text("popups"));
-        QVERIFY(popups || gui.views.stage()->childItems().first()->findChild<QQuickItem*>(text("popups"))->childItems().size() == 1);
+        QVERIFY(popups
+                || gui.views.stage()->childItems().first()->findChild<QQuickItem*>(text("popups"))->childItems().size()
+                       == 1);
     }
 
     void anIdleUserIsToldToTheView()

@@ -38,10 +38,12 @@ class DltTest : public QObject
 
     bool receives(const QByteArray& text)
     {
-        return QTest::qWaitFor([&] {
-            m_received += m_client.readAllStandardOutput();
-            return m_received.contains(text);
-        }, deadline);
+        return QTest::qWaitFor(
+            [&] {
+                m_received += m_client.readAllStandardOutput();
+                return m_received.contains(text);
+            },
+            deadline);
     }
 
     /// Standard error of a process that logs the lines of main() below; null when it did not end in time.
@@ -50,7 +52,8 @@ class DltTest : public QObject
         QProcess process;
         process.setProcessEnvironment(environment());
         process.start(QCoreApplication::applicationFilePath(), {QStringLiteral("--emit")});
-        return process.waitForFinished(deadline) && process.exitCode() == 0 ? process.readAllStandardError() : QByteArray();
+        return process.waitForFinished(deadline) && process.exitCode() == 0 ? process.readAllStandardError()
+                                                                            : QByteArray();
     }
 
     void startDaemon()
@@ -59,20 +62,25 @@ class DltTest : public QObject
         QVERIFY(configuration.open(QIODevice::WriteOnly));
         configuration.write("BindAddress = ::ffff:127.0.0.1\nLoggingMode = 3\n");
         configuration.close();
-        m_daemon.start(QStringLiteral("dlt-daemon"), {QStringLiteral("-c"), configuration.fileName(), QStringLiteral("-t"), m_folder.path(),
-                                                      QStringLiteral("-p"), QString::number(port)});
+        m_daemon.start(QStringLiteral("dlt-daemon"),
+                       {QStringLiteral("-c"), configuration.fileName(), QStringLiteral("-t"), m_folder.path(),
+                        QStringLiteral("-p"), QString::number(port)});
         QVERIFY(m_daemon.waitForStarted());
         QTRY_VERIFY(QFile::exists(m_folder.filePath(QStringLiteral("dlt"))));
         // Line by line, although it writes to a pipe.
-        m_client.start(QStringLiteral("stdbuf"), {QStringLiteral("-oL"), QStringLiteral("dlt-receive"), QStringLiteral("-a"), QStringLiteral("-p"), QString::number(port), QStringLiteral("127.0.0.1")});
+        m_client.start(QStringLiteral("stdbuf"),
+                       {QStringLiteral("-oL"), QStringLiteral("dlt-receive"), QStringLiteral("-a"),
+                        QStringLiteral("-p"), QString::number(port), QStringLiteral("127.0.0.1")});
         QVERIFY(m_client.waitForStarted());
     }
 
 private Q_SLOTS:
     void initTestCase()
     {
-        QVERIFY2(!QStandardPaths::findExecutable(QStringLiteral("dlt-daemon")).isEmpty(), "package dlt-daemon is missing");
-        QVERIFY2(!QStandardPaths::findExecutable(QStringLiteral("dlt-receive")).isEmpty(), "package dlt-tools is missing");
+        QVERIFY2(!QStandardPaths::findExecutable(QStringLiteral("dlt-daemon")).isEmpty(),
+                 "package dlt-daemon is missing");
+        QVERIFY2(!QStandardPaths::findExecutable(QStringLiteral("dlt-receive")).isEmpty(),
+                 "package dlt-tools is missing");
     }
 
     void withoutADaemonNothingIsDelayedAndStandardErrorStillGetsEverything()
@@ -108,9 +116,10 @@ private Q_SLOTS:
         process.start(QCoreApplication::applicationFilePath(), {QStringLiteral("--wait-for-debug")});
         QVERIFY(receives("[waiting]"));
         QProcess control;
-        control.start(QStringLiteral("dlt-control"), {QStringLiteral("-p"), QString::number(port), QStringLiteral("-a"), QStringLiteral("WAIT"),
-                                                      QStringLiteral("-c"), QStringLiteral("C001"), QStringLiteral("-l"), QStringLiteral("5"),
-                                                      QStringLiteral("127.0.0.1")});
+        control.start(QStringLiteral("dlt-control"),
+                      {QStringLiteral("-p"), QString::number(port), QStringLiteral("-a"), QStringLiteral("WAIT"),
+                       QStringLiteral("-c"), QStringLiteral("C001"), QStringLiteral("-l"), QStringLiteral("5"),
+                       QStringLiteral("127.0.0.1")});
         QVERIFY(control.waitForFinished(deadline));
         QVERIFY(process.waitForFinished(deadline));
         QCOMPARE(process.exitCode(), 0);

@@ -44,7 +44,8 @@ private Q_SLOTS:
         QProcess child;
         child.start(QCoreApplication::applicationFilePath(), {QStringLiteral("--emit")});
         QVERIFY(child.waitForFinished());
-        const QStringList lines = QString::fromUtf8(child.readAllStandardError()).split(QLatin1Char('\n'), Qt::SkipEmptyParts);
+        const QStringList lines =
+            QString::fromUtf8(child.readAllStandardError()).split(QLatin1Char('\n'), Qt::SkipEmptyParts);
         QCOMPARE(lines.size(), 2);
         const QRegularExpression pattern(QStringLiteral("^\\[ *(\\d+\\.\\d{6})\\] ([WC]) default: (first|second)$"));
         const auto first = pattern.match(lines.at(0));

@@ -12,7 +12,8 @@
 struct StateTree
 {
     HmiStateMachine::StateMachine machine;
-    HmiStateMachine::NamedState* root = new HmiStateMachine::NamedState(QStringLiteral("Root"), QState::ParallelStates, &machine);
+    HmiStateMachine::NamedState* root =
+        new HmiStateMachine::NamedState(QStringLiteral("Root"), QState::ParallelStates, &machine);
     HmiStateMachine::HmiState* views = new HmiStateMachine::HmiState(QStringLiteral("Views"), root);
     HmiStateMachine::HmiState* home = new HmiStateMachine::HmiState(QStringLiteral("Home"), views);
     HmiStateMachine::HmiLayeredState* radio = new HmiStateMachine::HmiLayeredState(QStringLiteral("Radio"), views);

@@ -107,7 +107,8 @@ private Q_SLOTS:
         StateTree tree;
         QVERIFY(tree.start());
         QStringList entered;
-        connect(&tree.machine, &StateMachine::stateEntered, this, [&](NamedState* state) { entered.append(state->name()); });
+        connect(&tree.machine, &StateMachine::stateEntered, this,
+                [&](NamedState* state) { entered.append(state->name()); });
         tree.machine.requestState(QStringLiteral("Radio.List"));
         tree.machine.requestState(QStringLiteral("Home"));
         tree.machine.requestState(QStringLiteral("Radio.Edit"));

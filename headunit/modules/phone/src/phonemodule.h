@@ -20,7 +20,8 @@ public:
     HmiStateMachine::Identifier rootStateIdentifier() const override;
     QUrl iconUrl() const override;
     QList<QPair<HmiStateMachine::StateLevel, QAbstractTransition*>> moduleRootHierarchyTransitions() const override;
-    QList<QPair<HmiStateMachine::StateLevel, HmiStateMachine::PopupState*>> moduleRootHierarchyPopupStates() const override;
+    QList<QPair<HmiStateMachine::StateLevel, HmiStateMachine::PopupState*>>
+    moduleRootHierarchyPopupStates() const override;
     HmiStateMachine::NamedState* createRootState(HmiStateMachine::HmiState* modulesRootState) override;
     void setupRootContext(QQmlContext* rootContext) override;
 

@@ -28,8 +28,10 @@ TunerSource* tunerOf()
 constexpr Band allBands[] = {
     {QT_TRANSLATE_NOOP("RadioController", "FM"), GlobalSource::AudioFM, TunerSource::ModeFM, tunerOf<FMTunerSource>},
     {QT_TRANSLATE_NOOP("RadioController", "AM"), GlobalSource::AudioAM, TunerSource::ModeAM, tunerOf<AMTunerSource>},
-    {QT_TRANSLATE_NOOP("RadioController", "DAB"), GlobalSource::AudioDAB, TunerSource::ModeDAB, tunerOf<DABTunerSource>},
-    {QT_TRANSLATE_NOOP("RadioController", "Satellite"), GlobalSource::AudioXM, TunerSource::ModeXM, tunerOf<XMTunerSource>},
+    {QT_TRANSLATE_NOOP("RadioController", "DAB"), GlobalSource::AudioDAB, TunerSource::ModeDAB,
+     tunerOf<DABTunerSource>},
+    {QT_TRANSLATE_NOOP("RadioController", "Satellite"), GlobalSource::AudioXM, TunerSource::ModeXM,
+     tunerOf<XMTunerSource>},
 };
 constexpr int bandCount = int(sizeof allBands / sizeof *allBands);
 

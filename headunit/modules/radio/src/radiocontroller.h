@@ -17,8 +17,8 @@ class RadioController : public QObject
 public:
     explicit RadioController(QObject* parent);
 
-    QStringList bands() const;                 ///< names in the order in which they are offered
-    int band() const { return m_band; }        ///< index into bands()
+    QStringList bands() const;                ///< names in the order in which they are offered
+    int band() const { return m_band; }       ///< index into bands()
     AL2HMIBridge::TunerSource* tuner() const; ///< the tuner of the band
 
     /// \brief Makes a band the audio source. Values outside bands() are ignored.

@@ -58,7 +58,8 @@ NamedState* RadioModule::createRootState(HmiState* modulesRootState)
 
     // The sound page belongs to the settings module; it is built into this state as soon as that module offers it.
     auto* const sound = new HmiLayeredState(QStringLiteral("RADIO.Sound"), root);
-    HmiCore::HmiSubmoduleProvider::instance()->requestSubmodule(ModuleDomain::Sound, sound, sound->name(), moduleDomain());
+    HmiCore::HmiSubmoduleProvider::instance()->requestSubmodule(ModuleDomain::Sound, sound, sound->name(),
+                                                                moduleDomain());
     return root;
 }
 

@@ -50,7 +50,10 @@ public:
     QString themeFile() const { return m_themeFile; } ///< theme document; empty for the built-in one
     void setThemeFile(const QString& path);
 
-    QString uiVariation() const { return m_uiVariation; } ///< name of the views' variation, such as "compact"; may be empty
+    QString uiVariation() const
+    {
+        return m_uiVariation;
+    } ///< name of the views' variation, such as "compact"; may be empty
     void setUiVariation(const QString& variation);
 
     int viewCacheSize() const { return m_viewCacheSize; } ///< views kept beside the current one; 5 by default

@@ -25,7 +25,8 @@ class HMIGUIFRAMEWORK_EXPORT TransitionManager : public QObject
     Q_OBJECT
     Q_PROPERTY(bool running READ isRunning NOTIFY runningChanged)
     Q_PROPERTY(int duration READ duration WRITE setDuration NOTIFY durationChanged)
-    Q_PROPERTY(QString defaultTransition READ defaultTransition WRITE setDefaultTransition NOTIFY defaultTransitionChanged)
+    Q_PROPERTY(
+        QString defaultTransition READ defaultTransition WRITE setDefaultTransition NOTIFY defaultTransitionChanged)
 
 public:
     enum Transition { None, Fade, SlideForward, SlideBackward };

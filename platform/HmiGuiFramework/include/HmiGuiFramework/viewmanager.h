@@ -58,10 +58,13 @@ public:
     /// rest is loaded; a name that is loaded already stays as it was.
     void loadModule(const QString& viewDescriptor, const QString& prefixOrId, int flagOrDomain);
 
-    QString currentView() const { return m_currentView; }   ///< identifier of the view on the screen; empty before the first
-    QQuickItem* currentItem() const;                        ///< its item, or null before the first
-    QString currentPopup() const;                           ///< identifier of the topmost popup, or empty
-    QQuickItem* stage() const { return m_stage.get(); }     ///< what the window shows; owned by the manager
+    QString currentView() const
+    {
+        return m_currentView;
+    }                                ///< identifier of the view on the screen; empty before the first
+    QQuickItem* currentItem() const; ///< its item, or null before the first
+    QString currentPopup() const;    ///< identifier of the topmost popup, or empty
+    QQuickItem* stage() const { return m_stage.get(); } ///< what the window shows; owned by the manager
 
     /// \brief Asks for a view by its name, or by that of a state that leads to a view.
     ///
