@@ -5,10 +5,11 @@
 #include "currentpalette.h"
 #include "guicategory.h"
 
+#include <QBuffer>
 #include <QColor>
 #include <QFile>
+#include <QImageReader>
 #include <QPainter>
-#include <QSvgRenderer>
 #include <QUrlQuery>
 
 namespace HmiGuiFramework {
@@ -32,24 +33,35 @@ QString fileOf(const QString& name)
     return QString();
 }
 
+QImage withOpacity(const QImage& image, qreal opacity)
+{
+    QImage faded(image.size(), QImage::Format_ARGB32_Premultiplied);
+    faded.fill(Qt::transparent);
+    QPainter painter(&faded);
+    painter.setOpacity(opacity);
+    painter.drawImage(0, 0, image);
+    painter.end();
+    return faded.copy(); // without the paint engine, which an image keeps once it was painted on
+}
+
+/// Through the image format plugin: the SVG library is large, and loaded with the first icon only.
 QImage drawSvg(const QString& file, const QColor& color, const QSize& requestedSize)
 {
     QFile svg(file);
     if (!svg.open(QIODevice::ReadOnly))
         return QImage();
-    QSvgRenderer renderer(svg.readAll().replace("currentColor", color.name().toLatin1()));
-    QSize size = renderer.defaultSize();
-    if (requestedSize.isValid())
+    QByteArray text = svg.readAll().replace("currentColor", color.name().toLatin1());
+    QBuffer buffer(&text);
+    QImageReader reader(&buffer, "svg");
+    if (requestedSize.isValid()) {
+        QSize size = reader.size();
         size.scale(requestedSize.boundedTo(QSize(largestSide, largestSide)), Qt::KeepAspectRatio);
-    if (size.isEmpty())
-        return QImage();
-    QImage image(size, QImage::Format_ARGB32_Premultiplied);
-    image.fill(Qt::transparent);
-    QPainter painter(&image);
-    painter.setOpacity(color.alphaF());
-    renderer.render(&painter);
-    painter.end();
-    return image.copy(); // without the paint engine, which an image keeps once it was painted on
+        reader.setScaledSize(size);
+    }
+    const QImage image = reader.read();
+    if (image.isNull())
+        return image;
+    return color.alpha() < 255 ? withOpacity(image, color.alphaF()) : image.copy();
 }
 
 QImage draw(const QString& file, const QColor& color, const QSize& requestedSize)

@@ -31,6 +31,14 @@ private Q_SLOTS:
         QCOMPARE(image.pixelColor(24, 24), QColor(0xff, 0x80, 0x00));
     }
 
+    void aTranslucentColourMakesATranslucentIcon()
+    {
+        HmiImageProvider provider;
+        const QImage image = provider.requestImage(QStringLiteral("dot?color=%2380ff0000"), nullptr, QSize(8, 8));
+        QVERIFY(qAbs(image.pixelColor(4, 4).alpha() - 0x80) <= 1);
+        QCOMPARE(image.pixelColor(4, 4).red(), 0xff);
+    }
+
     void hasItsOwnSizeWithoutARequestedOne()
     {
         HmiImageProvider provider;
