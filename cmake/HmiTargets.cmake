@@ -77,9 +77,18 @@ function(hmi_add_test name)
     endif()
     add_executable(${name} ${ARG_SOURCES})
     target_link_libraries(${name} PRIVATE HmiTestSupport Qt${QT_VERSION_MAJOR}::Test ${ARG_LINK})
+    hmi_watch_threads(${name})
     add_test(NAME ${name} COMMAND ${name})
     set_tests_properties(${name} PROPERTIES TIMEOUT ${ARG_TIMEOUT}
         ENVIRONMENT "QT_QPA_PLATFORM=offscreen;QT_QUICK_BACKEND=software;LC_ALL=C.UTF-8;${HMI_TEST_ENVIRONMENT};${ARG_ENVIRONMENT}")
+endfunction()
+
+# hmi_watch_threads(<executable>): lets the thread sanitizer, if there is one, see what Qt orders between threads. Every
+# program that tests run needs it.
+function(hmi_watch_threads name)
+    if(HMI_WATCH_THREADS)
+        target_link_libraries(${name} PRIVATE HmiThreadAnnotations)
+    endif()
 endfunction()
 
 # hmi_add_module(<name> SOURCES ... QML ... FILES ...): an HMI module plugin of the reference head unit.
