@@ -41,6 +41,14 @@ class ScreenshotTest : public QObject
     QTemporaryDir m_folder;
 
 private Q_SLOTS:
+    void helpNamesTheProgramAndItsOptions()
+    {
+        const Result help = headunit({QStringLiteral("--help")});
+        QCOMPARE(help.exitCode, 0);
+        QVERIFY(help.output.contains(QStringLiteral("headunit [options]")));
+        QVERIFY(help.output.contains(QStringLiteral("--list-views")));
+    }
+
     void everyViewIsDrawn_data()
     {
         QTest::addColumn<QString>("view");

@@ -2,7 +2,11 @@
 #include "commandline.h"
 
 #include <QCommandLineParser>
+#include <QCoreApplication>
+#include <QFile>
 #include <QRegularExpression>
+
+#include <memory>
 
 namespace {
 
@@ -24,6 +28,18 @@ QSize sizeFrom(const QString& text)
     const QSize size(match.captured(1).toInt(), match.captured(2).toInt());
     const auto isUsable = [](int side) { return side >= smallestSide && side <= largestSide; };
     return isUsable(size.width()) && isUsable(size.height()) ? size : QSize();
+}
+
+/// Qt takes the program's name from the application object, which is not there yet when the program begins.
+QString helpText(const QCommandLineParser& parser, const QStringList& arguments)
+{
+    std::unique_ptr<QCoreApplication> application;
+    QByteArray name = QFile::encodeName(arguments.value(0));
+    char* argv[] = {name.data(), nullptr};
+    int argc = 1;
+    if (!QCoreApplication::instance())
+        application = std::make_unique<QCoreApplication>(argc, argv);
+    return parser.helpText();
 }
 
 } // namespace
@@ -60,7 +76,7 @@ CommandLine CommandLine::parse(const QStringList& arguments)
     CommandLine line;
     if (parser.isSet(help)) {
         line.outcome = Done;
-        line.message = parser.helpText();
+        line.message = helpText(parser, arguments);
         return line;
     }
     if (parser.isSet(size)) {
