@@ -74,7 +74,7 @@ QHash<int, QByteArray> HmiActionModel::roleNames() const
 
 void HmiActionModel::trigger(int row)
 {
-    if (row >= 0 && row < count())
+    if (row >= 0 && row < count() && m_actions.at(row))
         m_actions.at(row)->trigger();
 }
 

@@ -103,6 +103,22 @@ private Q_SLOTS:
         QCOMPARE(texts(model), QStringLiteral("b"));
     }
 
+    void aRowHasNoDataWhileItsDeletedActionLeaves()
+    {
+        HmiActionModel model(nullptr);
+        auto a = action("a");
+        model.addChild(a.get());
+        bool asked = false;
+        connect(&model, &QAbstractItemModel::rowsAboutToBeRemoved, this, [&] {
+            asked = true;
+            for (const int role : {int(HmiActionModel::ActionRole), int(HmiActionModel::TextRole)})
+                QVERIFY(!model.index(0).data(role).isValid());
+            model.trigger(0);
+        });
+        a.reset();
+        QVERIFY(asked);
+    }
+
     void triggerReachesEnabledActionsOnly()
     {
         HmiActionModel model(nullptr);
