@@ -62,7 +62,7 @@ if(ECM_ENABLE_SANITIZERS MATCHES "address")
         "LSAN_OPTIONS=suppressions=${PROJECT_SOURCE_DIR}/tests/support/lsan.supp:print_suppressions=0")
 endif()
 
-# Qt 6 is built otherwise than what our annotations stand before.
+# The annotations that let the sanitizer see through Qt stand before functions of Qt 5.
 if(ECM_ENABLE_SANITIZERS MATCHES "thread" AND QT_VERSION_MAJOR EQUAL 5)
     set(HMI_WATCH_THREADS ON)
     list(APPEND HMI_TEST_ENVIRONMENT "TSAN_OPTIONS=suppressions=${PROJECT_SOURCE_DIR}/tests/support/tsan.supp")
