@@ -25,8 +25,8 @@ LogCapture::~LogCapture()
     QLoggingCategory::setFilterRules(QString());
     const QStringList left = unexpected();
     if (!left.isEmpty())
-        QTest::qFail(qPrintable(QStringLiteral("unexpected log lines:\n  ") + left.join(QStringLiteral("\n  "))), __FILE__,
-                     __LINE__);
+        QTest::qFail(qPrintable(QStringLiteral("unexpected log lines:\n  ") + left.join(QStringLiteral("\n  "))),
+                     __FILE__, __LINE__);
 }
 
 void LogCapture::handle(QtMsgType type, const QMessageLogContext& context, const QString& message)
