@@ -27,10 +27,17 @@ namespace HmiGuiFramework {
 namespace {
 
 template <typename Descriptor>
+Descriptor inVariation(Descriptor descriptor, const QString& variation)
+{
+    descriptor.url = descriptor.variations.value(variation, descriptor.variations.value(QString()));
+    return descriptor;
+}
+
+template <typename Descriptor>
 void setVariation(QHash<QString, Descriptor>* descriptors, const QString& variation)
 {
     for (Descriptor& descriptor : *descriptors)
-        descriptor.url = descriptor.variations.value(variation, descriptor.variations.value(QString()));
+        descriptor = inVariation(descriptor, variation);
 }
 
 void setIfPresent(QObject* object, const char* property, const QVariant& value)
@@ -84,16 +91,15 @@ void ViewManager::loadModule(const QString& viewDescriptor, const QString& prefi
     const ParsedDescriptor parsed = parseDescriptor(resolvedPath(viewDescriptor), prefixOrId, flagOrDomain);
     for (const QString& error : parsed.errors)
         qCWarning(guiCategory).noquote() << QStringLiteral("view descriptor %1: %2").arg(viewDescriptor, error);
+    const QString variation = AppSettings::instance()->uiVariation();
     for (const ViewDescriptor& view : parsed.views)
-        add(&m_descriptor.views, view.identifier, view, "view", viewDescriptor);
+        add(&m_descriptor.views, view.identifier, inVariation(view, variation), "view", viewDescriptor);
     for (const PopupDescriptor& popup : parsed.popups)
-        add(&m_descriptor.popups, popup.identifier, popup, "popup", viewDescriptor);
+        add(&m_descriptor.popups, popup.identifier, inVariation(popup, variation), "popup", viewDescriptor);
     for (const TransientDescriptor& transient : parsed.transients)
         add(&m_transients.transients, transient.identifier, transient, "transient", viewDescriptor);
     for (const auto& component : parsed.components)
         add(&m_transients.components, component.first, component.second, "component", viewDescriptor);
-    setVariation(&m_descriptor.views, AppSettings::instance()->uiVariation());
-    setVariation(&m_descriptor.popups, AppSettings::instance()->uiVariation());
     if (!parsed.shell.isEmpty())
         setShell(parsed.shell);
 }

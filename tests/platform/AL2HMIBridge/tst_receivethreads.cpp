@@ -162,6 +162,7 @@ private Q_SLOTS:
 
     void peerOfAnotherUserIsRefused()
     {
+        // A real peer of another user takes the right to become one; nothing less would test the kernel's answer.
         if (::geteuid() != 0)
             QSKIP("only root can make a process of another user listen");
         m_bridge->peer.die();

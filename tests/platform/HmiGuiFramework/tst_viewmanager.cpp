@@ -193,6 +193,15 @@ private Q_SLOTS:
         QVERIFY(gui.views.currentItem()->property("compact").toBool());
     }
 
+    void aDescriptorLoadedLaterHasTheVariationInForce()
+    {
+        GuiFixture gui;
+        AppSettings::instance()->setUiVariation(text("compact"));
+        gui.views.loadModule(text(":/gui/data/views.json"), text("Late"), 0);
+        QCOMPARE(gui.views.guiDescriptor().views.value(text("Late.Main")).url,
+                 QUrl(text("qrc:/gui/data/ViewCompact.qml")));
+    }
+
     void theVariationChangesWhileAPopupIsShown()
     {
         GuiFixture gui;
