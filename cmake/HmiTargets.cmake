@@ -26,7 +26,9 @@ function(hmi_add_library name)
                "$<BUILD_INTERFACE:${forwarding}>" # lets a forwarded header find its neighbours, as when installed
                "$<INSTALL_INTERFACE:${CMAKE_INSTALL_INCLUDEDIR}>")
     target_link_libraries(${name} PUBLIC ${ARG_PUBLIC} PRIVATE ${ARG_PRIVATE})
-    set_target_properties(${name} PROPERTIES VERSION ${PROJECT_VERSION} SOVERSION ${PROJECT_VERSION_MAJOR})
+    list(TRANSFORM ARG_HEADERS PREPEND ${CMAKE_CURRENT_SOURCE_DIR}/ REGEX "^[^/]" OUTPUT_VARIABLE all_headers)
+    set_target_properties(${name} PROPERTIES VERSION ${PROJECT_VERSION} SOVERSION ${PROJECT_VERSION_MAJOR}
+        HMI_HEADERS "${all_headers}")
     install(TARGETS ${name} EXPORT ${ARG_EXPORT} COMPONENT ${ARG_EXPORT})
     install(FILES ${forwarded} ${ARG_HEADERS} ${forwarding}/${lower}_export.h
         DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}/${name} COMPONENT ${ARG_EXPORT})
@@ -66,9 +68,10 @@ function(hmi_add_resources target)
     target_sources(${target} PRIVATE ${generated})
 endfunction()
 
-# hmi_add_test(<tst_name> [SOURCES ...] [LINK ...]): one QtTest executable, run headless with a deadline.
+# hmi_add_test(<tst_name> [SOURCES ...] [LINK ...] [WRAPPER program]): one QtTest executable, run headless with a deadline,
+# by another program if it needs that.
 function(hmi_add_test name)
-    cmake_parse_arguments(ARG "" "TIMEOUT" "SOURCES;LINK;ENVIRONMENT" ${ARGN})
+    cmake_parse_arguments(ARG "" "TIMEOUT;WRAPPER" "SOURCES;LINK;ENVIRONMENT" ${ARGN})
     if(NOT ARG_SOURCES)
         set(ARG_SOURCES ${name}.cpp)
     endif()
@@ -78,7 +81,7 @@ function(hmi_add_test name)
     add_executable(${name} ${ARG_SOURCES})
     target_link_libraries(${name} PRIVATE HmiTestSupport Qt${QT_VERSION_MAJOR}::Test ${ARG_LINK})
     hmi_watch_threads(${name})
-    add_test(NAME ${name} COMMAND ${name})
+    add_test(NAME ${name} COMMAND ${ARG_WRAPPER} $<TARGET_FILE:${name}>)
     set_tests_properties(${name} PROPERTIES TIMEOUT ${ARG_TIMEOUT}
         ENVIRONMENT "QT_QPA_PLATFORM=offscreen;QT_QUICK_BACKEND=software;LC_ALL=C.UTF-8;${HMI_TEST_ENVIRONMENT};${ARG_ENVIRONMENT}")
 endfunction()
@@ -108,14 +111,61 @@ function(hmi_add_module name)
     hmi_add_translations(${name})
 endfunction()
 
-# hmi_add_translations(<name>): makes a target that brings translations/<name>.ts, the catalogue of all texts of this
-# folder, in step with the sources; `update_translations` does so for all.
+# The languages of the reference head unit, and the locales that each serves.
+set(HMI_LANGUAGES en de fr es ar zh_CN zh_TW)
+set(HMI_LOCALES_en en_US en_GB)
+set(HMI_LOCALES_de de_DE)
+set(HMI_LOCALES_fr fr_FR fr_CA)
+set(HMI_LOCALES_es es_ES es_MX)
+set(HMI_LOCALES_ar ar_SA)
+set(HMI_LOCALES_zh_CN zh_CN)
+set(HMI_LOCALES_zh_TW zh_TW)
+
+# hmi_add_translations(<name> [PRODUCT] [FOLDERS ...]): compiles translations/<name>_<language>.ts. A module's are found by
+# language (translations/<name>_de.qm), those of the product by locale (translations/app/<name>_de_DE.qm). The target
+# `update_translations` brings all .ts files in step with the texts in FOLDERS, by default in this one.
 function(hmi_add_translations name)
+    cmake_parse_arguments(ARG "PRODUCT" "" "FOLDERS" ${ARGN})
+    if(NOT ARG_FOLDERS)
+        set(ARG_FOLDERS ${CMAKE_CURRENT_SOURCE_DIR})
+    endif()
+    set(sources "")
+    set(catalogues "")
+    foreach(language IN LISTS HMI_LANGUAGES)
+        set(source ${CMAKE_CURRENT_SOURCE_DIR}/translations/${name}_${language}.ts)
+        list(APPEND sources ${source})
+        if(ARG_PRODUCT)
+            list(TRANSFORM HMI_LOCALES_${language} PREPEND app/${name}_ OUTPUT_VARIABLE files)
+        else()
+            set(files ${name}_${language})
+        endif()
+        foreach(file IN LISTS files)
+            set(catalogue ${HMI_BASE_DIR}/translations/${file}.qm)
+            get_filename_component(folder ${catalogue} DIRECTORY)
+            file(MAKE_DIRECTORY ${folder})
+            add_custom_command(OUTPUT ${catalogue} DEPENDS ${source}
+                COMMAND Qt${QT_VERSION_MAJOR}::lrelease -silent ${source} -qm ${catalogue})
+            list(APPEND catalogues ${catalogue})
+        endforeach()
+    endforeach()
+    add_custom_target(translations_${name} ALL DEPENDS ${catalogues})
+    foreach(catalogue IN LISTS catalogues)
+        file(RELATIVE_PATH relative ${HMI_BASE_DIR} ${catalogue})
+        get_filename_component(folder ${relative} DIRECTORY)
+        install(FILES ${catalogue} DESTINATION ${HMI_HEADUNIT_DIR}/${folder} COMPONENT headunit)
+    endforeach()
+
+    set(kind MODULE)
+    if(ARG_PRODUCT)
+        set(kind PRODUCT)
+    endif()
+    string(REPLACE ";" "|" folders "${ARG_FOLDERS}")
+    set_property(GLOBAL APPEND PROPERTY HMI_CATALOGUES "${name}|${CMAKE_CURRENT_SOURCE_DIR}/translations|${kind}|${folders}")
+
     if(NOT TARGET update_translations)
         add_custom_target(update_translations)
     endif()
     add_custom_target(update_translations_${name}
-        COMMAND Qt${QT_VERSION_MAJOR}::lupdate -silent -locations none -no-obsolete ${CMAKE_CURRENT_SOURCE_DIR}
-            -ts ${CMAKE_CURRENT_SOURCE_DIR}/translations/${name}.ts)
+        COMMAND Qt${QT_VERSION_MAJOR}::lupdate -silent -locations none -no-obsolete ${ARG_FOLDERS} -ts ${sources})
     add_dependencies(update_translations update_translations_${name})
 endfunction()

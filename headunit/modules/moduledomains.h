@@ -5,8 +5,13 @@
 namespace ModuleDomain {
 enum Id : int {
     Radio = 10,
+    Navigation = 12,
+    Media = 15,
     Phone = 20,
+    Climate = 25,
+    Messages = 27,
     Settings = 30,
+    Apps = 28,
     Sound = 31, ///< submodule of the settings module: volume and tone
 };
 }

@@ -7,6 +7,6 @@ Rectangle {
     radius: Theme.radius
 
     Behavior on color {
-        ColorAnimation { duration: Theme.durationLong }
+        ColorAnimation { duration: Theme.durationLong; easing.type: Theme.easing }
     }
 }

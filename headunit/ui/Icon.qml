@@ -13,6 +13,6 @@ Image {
     height: size
     sourceSize.width: size
     sourceSize.height: size
-    source: base.toString().length > 0 ? base + "?color=" + encodeURIComponent(color.toString()) : ""
+    source: String(base).length > 0 ? base + "?color=" + encodeURIComponent(color.toString()) : ""
     mirror: mirrorsWithLayout && Theme.mirrored
 }

@@ -11,6 +11,6 @@ Text {
     maximumLineCount: 1
     color: Theme.text
     font.pixelSize: Theme.textBody
-    horizontalAlignment: Theme.mirrored ? Text.AlignRight : Text.AlignLeft
+    horizontalAlignment: Text.AlignLeft // mirrored with the layout, whatever direction the text has
     verticalAlignment: Text.AlignVCenter
 }

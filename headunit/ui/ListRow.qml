@@ -27,6 +27,7 @@ Tappable {
 
         anchors { left: parent.left; leftMargin: Theme.gap; verticalCenter: parent.verticalCenter }
         visible: root.icon.length > 0
+        opacity: root.dimmed ? 0.4 : 1
         name: root.icon
         color: root.selected ? Theme.accent : Theme.textMuted
     }
@@ -51,6 +52,7 @@ Tappable {
             width: parent.width
             visible: root.subtitle.length > 0
             content: root.subtitle
+            opacity: root.dimmed ? 0.4 : 1
             color: Theme.textMuted
             font.pixelSize: Theme.textCaption
         }

@@ -10,7 +10,9 @@ Tappable {
     property color color: primary ? Theme.accent : Theme.surfaceHigh
     property color textColor: primary ? Theme.accentText : Theme.text
 
-    implicitWidth: Math.max(Theme.px(160), content.implicitWidth + 2 * Theme.margin)
+    readonly property real iconSpace: icon.length > 0 ? Theme.px(28) + content.spacing : 0
+
+    implicitWidth: Math.max(Theme.px(160), iconSpace + label.implicitWidth + 2 * Theme.margin)
     implicitHeight: Theme.touchTarget
     radius: height / 2
     fill: color
@@ -24,6 +26,7 @@ Tappable {
         anchors.centerIn: parent
         spacing: Theme.gap / 2
         layoutDirection: Theme.mirrored ? Qt.RightToLeft : Qt.LeftToRight
+        LayoutMirroring.enabled: false // mirrored by its layout direction
 
         Icon {
             anchors.verticalCenter: parent.verticalCenter
@@ -34,9 +37,11 @@ Tappable {
         }
 
         Label {
+            id: label
+
             anchors.verticalCenter: parent.verticalCenter
             visible: root.text.length > 0
-            width: Math.min(implicitWidth, root.width - 2 * Theme.margin - (root.icon.length > 0 ? Theme.px(28) + Theme.gap / 2 : 0))
+            width: Math.min(implicitWidth, root.width - 2 * Theme.margin - root.iconSpace)
             content: root.text
             color: root.textColor
             font.weight: Font.DemiBold

@@ -21,7 +21,7 @@ Item {
         color: Theme.background
 
         Behavior on color {
-            ColorAnimation { duration: Theme.durationLong }
+            ColorAnimation { duration: Theme.durationLong; easing.type: Theme.easing }
         }
     }
 }

@@ -11,19 +11,22 @@ Rectangle {
     signal chosen(int index)
 
     implicitHeight: Theme.touchTarget
-    implicitWidth: options.length * Theme.px(128)
+    implicitWidth: segments.width
     radius: height / 2
     color: Theme.surfaceHigh
 
     Row {
-        anchors.fill: parent
+        id: segments
+
+        height: parent.height
         layoutDirection: Theme.mirrored ? Qt.RightToLeft : Qt.LeftToRight
+        LayoutMirroring.enabled: false // mirrored by its layout direction
 
         Repeater {
             model: root.options
 
             Tappable {
-                width: root.width / root.options.length
+                width: Math.max(Theme.px(128), text.implicitWidth + 2 * Theme.gap)
                 height: root.height
                 radius: height / 2
                 label: modelData
@@ -31,10 +34,10 @@ Rectangle {
                 onClicked: root.chosen(index)
 
                 Label {
-                    anchors.fill: parent
-                    anchors.margins: Theme.gap / 2
+                    id: text
+
+                    anchors.centerIn: parent
                     content: modelData
-                    horizontalAlignment: Text.AlignHCenter
                     color: index === root.current ? Theme.accentText : Theme.text
                     font.weight: Font.DemiBold
                 }

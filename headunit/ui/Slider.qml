@@ -9,8 +9,18 @@ Item {
     property int to: 100
     property int value: 0
     property string label
+    property bool mirrored: Theme.mirrored
+    property bool focused: false // the knob is at it
 
     signal moved(int value)
+
+    /// Moves by so many twentieths of the range, at least by one: what a press of the knob lets it do.
+    function adjust(steps) {
+        const step = Math.max(1, Math.round((to - from) / 20));
+        const wanted = Math.max(from, Math.min(to, value + steps * step));
+        if (wanted !== value)
+            moved(wanted);
+    }
 
     implicitHeight: Theme.touchTarget
     implicitWidth: Theme.px(320)
@@ -30,7 +40,7 @@ Item {
         color: Theme.outline
 
         Rectangle {
-            x: Theme.mirrored ? parent.width - width : 0
+            x: root.mirrored ? parent.width - width : 0
             width: parent.width * root.ratio
             height: parent.height
             radius: parent.radius
@@ -39,7 +49,7 @@ Item {
     }
 
     Rectangle {
-        readonly property real place: Theme.mirrored ? 1 - root.ratio : root.ratio
+        readonly property real place: root.mirrored ? 1 - root.ratio : root.ratio
 
         anchors.verticalCenter: parent.verticalCenter
         x: (root.width - width) * place
@@ -51,6 +61,11 @@ Item {
         border.color: Theme.surface
     }
 
+    FocusRing {
+        shown: root.focused
+        around: Theme.radius
+    }
+
     MouseArea {
         objectName: "touchArea"
         anchors.fill: parent
@@ -58,7 +73,7 @@ Item {
 
         function ask(x) {
             const ratio = Math.max(0, Math.min(1, x / width));
-            const value = Math.round(root.from + (Theme.mirrored ? 1 - ratio : ratio) * (root.to - root.from));
+            const value = Math.round(root.from + (root.mirrored ? 1 - ratio : ratio) * (root.to - root.from));
             if (value !== root.value)
                 root.moved(value);
         }

@@ -6,6 +6,7 @@ Item {
     id: root
 
     property bool active: true
+    property bool focused: false // the knob is at it
     property real radius: Theme.radius
     property color fill: "transparent"
     property color pressedFill: Theme.surfacePressed
@@ -24,8 +25,13 @@ Item {
         color: area.pressed ? root.pressedFill : root.fill
 
         Behavior on color {
-            ColorAnimation { duration: Theme.durationShort }
+            ColorAnimation { duration: Theme.durationShort; easing.type: Theme.easing }
         }
+    }
+
+    FocusRing {
+        shown: root.focused
+        around: root.radius
     }
 
     MouseArea {

@@ -7,9 +7,13 @@ Item {
 
     property bool on: false
     property bool active: true
+    property bool focused: false // the knob is at it
     property string label
 
     signal toggled(bool on)
+
+    /// As a touch does.
+    function activate() { toggled(!on); }
 
     implicitWidth: Theme.px(88)
     implicitHeight: Theme.touchTarget
@@ -39,9 +43,14 @@ Item {
             color: Theme.surface
 
             Behavior on x {
-                NumberAnimation { duration: Theme.durationShort }
+                NumberAnimation { duration: Theme.durationShort; easing.type: Theme.easing }
             }
         }
+    }
+
+    FocusRing {
+        shown: root.focused
+        around: track.radius
     }
 
     MouseArea {

@@ -177,8 +177,8 @@ def header(table, source):
             out += [f"    /// \\brief {event['brief']}", f"    void {event['name']}({parameters(table, event)});"]
         out.append("")
     if abstract:
-        out += ["protected:", f"    explicit {name}(const char* name);", f"    ~{name}() override;",
-                "    static const SourceInfo& info();", "", "private:"]
+        out += ["protected:", f"    explicit {name}(const char* name); ///< as Source", f"    ~{name}() override;",
+                "    static const SourceInfo& info(); ///< state and calls that its sources share", "", "private:"]
     else:
         out += ["private:", "    friend struct SourceTable;", f"    {name}();", "    static const SourceInfo& info();", ""]
     for field in state:

@@ -108,9 +108,9 @@ public:
 Q_SIGNALS:
     /// \brief The announcements of syncViews() begin.
     void hmiEntrySync();
-    void viewLoaded(const QString& identifier, const QString& url);
-    void popupLoaded(const QString& identifier, const QString& url);
-    void transientLoaded(const QString& identifier, const QString& url);
+    void viewLoaded(const QString& identifier, const QString& url);      ///< one of the loaded views
+    void popupLoaded(const QString& identifier, const QString& url);     ///< one of the loaded popups
+    void transientLoaded(const QString& identifier, const QString& url); ///< one of the loaded transients
 
     /// \brief The layer behind the HMI was touched.
     void passThroughViewTouched();

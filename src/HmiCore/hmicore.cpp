@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "hmicore.h"
 
+#include "logcategories.h"
 #include "qmlloggers.h"
 
 #include <HmiLogging/HmiLogging>
@@ -11,6 +12,12 @@ namespace HmiCore {
 QLoggingCategory& hmicore()
 {
     static HmiLogging::HmiLoggingCategory category("kest.hmicore", 1);
+    return category;
+}
+
+const QLoggingCategory& decisionsLog()
+{
+    static const HmiLogging::HmiLoggingCategory category("kest.hmicore.decisions", 1);
     return category;
 }
 

@@ -25,4 +25,9 @@ HMICORE_EXPORT QLoggingCategory& hmicore();
 /// makes the caller fail. Call it once per engine, in the engine's thread, before QML is loaded.
 HMICORE_EXPORT void installCustomLogObjects(QQmlEngine* engine);
 
+/// \brief Registers the QML modules `HmiCore`, `HmiIntents` and `HmiOverrides`, version 1.0.
+///
+/// Call it once, in the GUI thread, before QML that imports them is loaded: HmiInitializer::registerQmlTypes() is the place.
+HMICORE_EXPORT void registerTypes();
+
 } // namespace HmiCore

@@ -26,4 +26,7 @@ inline const QLoggingCategory& traceLog()
     return HmiLogging::hmitrace();
 }
 
+/// What was decided for keys and intents, and why; off unless a rule switches it on.
+const QLoggingCategory& decisionsLog();
+
 } // namespace HmiCore

@@ -52,6 +52,8 @@ private Q_SLOTS:
         row("accent", "surface");
         row("accent", "accentSoft");
         row("accentText", "accent");
+        row("lightOnDark", "dark");
+        row("mutedOnDark", "dark");
         row("signalText", "positive");
         row("signalText", "negative");
     }

@@ -25,6 +25,8 @@ public Q_SLOTS:
         m_windows = std::make_unique<WindowManager>(AppSettings::instance(), nullptr);
         m_theme = std::make_unique<UiThemeManager>(engine, nullptr, nullptr, nullptr);
         engine->addImageProvider(HmiImageProvider::imageProviderName, new HmiImageProvider);
+        m_lock.setProperty("locked", false);
+        engine->rootContext()->setContextProperty(QStringLiteral("_drivingLock"), &m_lock);
         engine->rootContext()->setContextProperty(QStringLiteral("AppSettings"), AppSettings::instance());
         engine->rootContext()->setContextProperty(QStringLiteral("_hmiWindow"), m_windows->hmiWindow());
     }
@@ -36,6 +38,7 @@ public Q_SLOTS:
     }
 
 private:
+    QObject m_lock; ///< as the product's, with a property "locked"
     std::unique_ptr<WindowManager> m_windows;
     std::unique_ptr<UiThemeManager> m_theme;
 };

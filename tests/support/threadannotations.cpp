@@ -51,7 +51,7 @@ bool delivered(void** call)
 
 [[maybe_unused]] const bool deliveriesAreSeen = QInternal::registerCallback(QInternal::EventNotifyCallback, delivered);
 
-/// Calls a function that another thread posted. Qt counts the references of its object where the sanitizer does not see
+/// Calls a function that another thread posted, or that is connected to a signal of one. Qt counts the references of its object where the sanitizer does not see
 /// it: whichever thread lets go last destroys the function, after the call.
 class PostedCall : public QtPrivate::QSlotObjectBase
 {
@@ -63,7 +63,7 @@ public:
     }
 
 private:
-    static void operate(int operation, QSlotObjectBase* base, QObject* receiver, void** arguments, bool*)
+    static void operate(int operation, QSlotObjectBase* base, QObject* receiver, void** arguments, bool* equal)
     {
         auto* const self = static_cast<PostedCall*>(base);
         if (operation == Call) {
@@ -73,6 +73,8 @@ private:
             __tsan_acquire(self);
             self->m_function->destroyIfLastRef();
             delete self;
+        } else if (operation == Compare) {
+            *equal = self->m_function->compare(arguments);
         }
     }
 
@@ -149,6 +151,17 @@ bool QMetaObject::invokeMethodImpl(QObject* object, QtPrivate::QSlotObjectBase* 
     auto* const call = new PostedCall(slot); // Qt's from here on
     posted(object);
     return next(object, call, type, result);
+}
+
+QMetaObject::Connection QObject::connectImpl(const QObject* sender, void** signal, const QObject* receiver,
+                                             void** function, QtPrivate::QSlotObjectBase* slot, Qt::ConnectionType type,
+                                             const int* types, const QMetaObject* senderType)
+{
+    static const auto next = replaced<QMetaObject::Connection (*)(const QObject*, void**, const QObject*, void**,
+                                                                  QtPrivate::QSlotObjectBase*, Qt::ConnectionType,
+                                                                  const int*, const QMetaObject*)>(
+        "_ZN7QObject11connectImplEPKS_PPvS1_S3_PN9QtPrivate15QSlotObjectBaseEN2Qt14ConnectionTypeEPKiPK11QMetaObject");
+    return next(sender, signal, receiver, function, new PostedCall(slot), type, types, senderType); // Qt's from here on
 }
 
 void QMetaObject::activate(QObject* sender, const QMetaObject* type, int signal, void** arguments)

@@ -204,6 +204,21 @@ private Q_SLOTS:
         QCOMPARE(textOf("FMTunerSource", "frequency"), QStringLiteral("108.0"));
     }
 
+    void aReservedKnobDoesNotTune()
+    {
+        const QString before = textOf("FMTunerSource", "frequency");
+        call("GlobalSource", "reserveTuneKnob", {true});
+        for (const char* const key : {"sendPressedTuneUpKey", "sendPressedTuneDownKey", "sendLongPressedTuneUpKey"})
+            call("GlobalSource", key);
+        QCOMPARE(textOf("FMTunerSource", "frequency"), before);
+        call("GlobalSource", "sendShortPresetKey", {5}); // is another key
+        QVERIFY(textOf("FMTunerSource", "frequency") != before);
+        call("GlobalSource", "reserveTuneKnob", {false});
+        const QString tuned = textOf("FMTunerSource", "frequency");
+        call("GlobalSource", "sendPressedTuneUpKey");
+        QVERIFY(textOf("FMTunerSource", "frequency") != tuned);
+    }
+
     void presetsAreRecalledFromTheActiveBank()
     {
         call("FMTunerSource", "recallPreset", {1, 5});
@@ -287,6 +302,21 @@ private Q_SLOTS:
         QCOMPARE(number("GlobalSource", "volume"), 12);
     }
 
+    void volumeKeysChangeTheVoiceWhileItIsHeard()
+    {
+        call("GlobalSource", "sendPressedVoicePTTKey");
+        call("GlobalSource", "sendShortReleasedVolumeUpKey");
+        QCOMPARE(number("GlobalSource", "volume"), 12);
+        QCOMPARE(number("GlobalSource", "voiceVolume"), 17);
+        call("SpeechSource", "cancelVRSession");
+        call("SpeechSource", "voiceRecognitionNotReadyError");
+        call("GlobalSource", "sendShortReleasedVolumeDownKey");
+        QCOMPARE(number("GlobalSource", "voiceVolume"), 16);
+        call("SpeechSource", "cancelTTSSession");
+        call("GlobalSource", "sendShortReleasedVolumeUpKey");
+        QCOMPARE(number("GlobalSource", "volume"), 13);
+    }
+
     void muteEndsWithTheNextVolumeStep()
     {
         call("GlobalSource", "sendShortReleasedMuteKey");
@@ -336,16 +366,338 @@ private Q_SLOTS:
     void satelliteReplayStepsThroughTitles()
     {
         const QString live = textOf("XMTunerSource", "title");
-        call("XMTunerSource", "seekReverseShort");
+        call("XMTunerSource", "seekReverseShort"); // to the beginning of the title
         QCOMPARE(number("XMTunerSource", "replayStatus"), 1);
+        QCOMPARE(number("XMTunerSource", "replayOffset"), 100);
+        QCOMPARE(textOf("XMTunerSource", "title"), live);
+        call("XMTunerSource", "seekReverseShort"); // to the one before it
+        QCOMPARE(number("XMTunerSource", "replayOffset"), 300);
         QVERIFY(textOf("XMTunerSource", "title") != live);
-        call("XMTunerSource", "seekReverseLong", {1});
-        m_vehicle->advance(1500);
-        call("XMTunerSource", "seekReverseLong", {0});
-        QVERIFY(textOf("XMTunerSource", "title").contains(QStringLiteral("4 earlier")));
+        m_vehicle->advance(10000);
+        QCOMPARE(number("XMTunerSource", "replayOffset"), 300); // it plays on, as late as before
+        call("XMTunerSource", "seekForwardShort");
+        QCOMPARE(textOf("XMTunerSource", "title"), live);
         call("XMTunerSource", "goLive");
         QCOMPARE(textOf("XMTunerSource", "title"), live);
         QCOMPARE(number("XMTunerSource", "replayStatus"), 0);
+        QCOMPARE(number("XMTunerSource", "replayOffset"), 0);
+    }
+
+    void satelliteReplayWinds()
+    {
+        call("XMTunerSource", "seekReverseLong", {1});
+        m_vehicle->advance(2000);
+        call("XMTunerSource", "seekReverseLong", {0});
+        QCOMPARE(number("XMTunerSource", "replayOffset"), 40);
+        m_vehicle->advance(2000);
+        QCOMPARE(number("XMTunerSource", "replayOffset"), 40);
+        call("XMTunerSource", "seekForwardLong", {1});
+        m_vehicle->advance(60000);
+        QCOMPARE(number("XMTunerSource", "replayOffset"), 0);
+        call("XMTunerSource", "seekReverseLong", {1});
+        m_vehicle->peerLost();
+        call("GlobalSource", "setAudioSource", {2, -1});
+        m_vehicle->advance(600000);
+        QVERIFY(number("XMTunerSource", "replayOffset") <= number("XMTunerSource", "replayLength"));
+    }
+
+    void satellitePauseKeepsWhatComes()
+    {
+        call("XMTunerSource", "togglePlayPause", {0});
+        QCOMPARE(number("XMTunerSource", "playStatus"), 0);
+        QCOMPARE(number("XMTunerSource", "replayStatus"), 1);
+        m_vehicle->advance(30000);
+        QCOMPARE(number("XMTunerSource", "replayOffset"), 30);
+        call("XMTunerSource", "togglePlayPause", {1});
+        m_vehicle->advance(30000);
+        QCOMPARE(number("XMTunerSource", "replayOffset"), 30);
+        call("XMTunerSource", "togglePlayPause", {0});
+        m_vehicle->advance(3600 * 1000); // longer than is kept
+        QCOMPARE(number("XMTunerSource", "playStatus"), 1);
+        QCOMPARE(number("XMTunerSource", "replayOffset"), 1800);
+        call("XMTunerSource", "tuneToStation", {2});
+        QCOMPARE(number("XMTunerSource", "replayOffset"), 0);
+    }
+
+    void digitalSignalIsFoundLostAndFoundAgain()
+    {
+        QCOMPARE(number("FMTunerSource", "hdProgram"), 1);
+        call("FMTunerSource", "recallPreset", {1, 5});
+        QCOMPARE(value("FMTunerSource", "hdAvailable"), QJsonValue(true));
+        QCOMPARE(number("FMTunerSource", "hdProgram"), 0);
+        m_vehicle->advance(1500);
+        QCOMPARE(number("FMTunerSource", "hdProgram"), 1);
+        m_vehicle->setDigitalReception(false);
+        QCOMPARE(number("FMTunerSource", "hdProgram"), 0);
+        QCOMPARE(number("FMTunerSource", "hdSignalLossStatus"), 1);
+        m_vehicle->setDigitalReception(true);
+        QCOMPARE(number("FMTunerSource", "hdProgram"), 1);
+        QCOMPARE(number("FMTunerSource", "hdSignalLossStatus"), 0);
+        call("FMTunerSource", "recallPreset", {1, 2}); // has none
+        m_vehicle->advance(60000);
+        QCOMPARE(value("FMTunerSource", "hdAvailable"), QJsonValue(false));
+        m_vehicle->setDigitalReception(false);
+        QCOMPARE(number("FMTunerSource", "hdSignalLossStatus"), 0);
+    }
+
+    void retuningToTheMainProgrammeStaysAnalogue()
+    {
+        m_vehicle->setDigitalReception(false);
+        call("FMTunerSource", "tune", {QStringLiteral("88.7"), QStringLiteral("-1")});
+        QCOMPARE(number("FMTunerSource", "hdSignalLossStatus"), 0);
+        m_vehicle->advance(60000);
+        QCOMPARE(number("FMTunerSource", "hdProgram"), 0);
+        call("FMTunerSource", "tune", {QStringLiteral("88.7"), QStringLiteral("2")});
+        m_vehicle->advance(1500);
+        QCOMPARE(number("FMTunerSource", "hdProgram"), 2);
+        call("FMTunerSource", "tune", {QStringLiteral("88.7"), QStringLiteral("-1")});
+        call("GlobalSource", "sendShortSeekUp");
+        m_vehicle->advance(500);
+        call("GlobalSource", "sendShortSeekDown");
+        m_vehicle->advance(3000);
+        QCOMPARE(number("FMTunerSource", "hdProgram"), 1);
+    }
+
+    void weakDigitalSignalComesAndGoes()
+    {
+        call("FMTunerSource", "tune", {QStringLiteral("102.9"), QString()});
+        m_vehicle->advance(1500);
+        QCOMPARE(number("FMTunerSource", "hdProgram"), 1);
+        m_vehicle->advance(8000);
+        QCOMPARE(number("FMTunerSource", "hdSignalLossStatus"), 1);
+        m_vehicle->advance(8000);
+        QCOMPARE(number("FMTunerSource", "hdSignalLossStatus"), 0);
+        QCOMPARE(number("FMTunerSource", "hdProgram"), 1);
+    }
+
+    void seekRunsThroughTheBand()
+    {
+        call("GlobalSource", "sendShortSeekUp");
+        m_vehicle->advance(200);
+        const double between = textOf("FMTunerSource", "frequency").toDouble();
+        QVERIFY(between > 88.7 && between < 91.3);
+        QCOMPARE(value("FMTunerSource", "seeking"), QJsonValue(true));
+        call("GlobalSource", "sendShortSeekDown"); // changes its mind
+        m_vehicle->advance(500);
+        QCOMPARE(textOf("FMTunerSource", "frequency"), QStringLiteral("88.7"));
+    }
+
+    void autoStoreTellsHowFarItIs()
+    {
+        const QJsonValue before = value("AMTunerSource", "presets");
+        call("AMTunerSource", "startAutoStore");
+        m_vehicle->advance(1500);
+        QCOMPARE(number("AMTunerSource", "autoStoreProgress"), 50);
+        call("AMTunerSource", "sendAutoStoreCancel");
+        QCOMPARE(number("AMTunerSource", "autoStoreProgress"), 0);
+        m_vehicle->advance(60000);
+        QCOMPARE(value("AMTunerSource", "presets"), before);
+    }
+
+    void announcementsInterruptOtherSources()
+    {
+        call("AMTunerSource", "toggleTpSeekInProgress", {0, true});
+        call("GlobalSource", "setAudioSource", {16, -1});
+        m_vehicle->startTrafficAnnouncement(QStringLiteral("Jam"), QStringLiteral("AM"));
+        QCOMPARE(number("AMTunerSource", "announcementType"), 1);
+        QCOMPARE(number("FMTunerSource", "announcementType"), 0);
+        QCOMPARE(value("MediaAudioSource", "playing"), QJsonValue(false));
+        QCOMPARE(number("GlobalSource", "mainAudioSource"), 16);
+        m_vehicle->advance(20000);
+        QCOMPARE(value("MediaAudioSource", "playing"), QJsonValue(true));
+    }
+
+    void callsInterruptWhatPlays()
+    {
+        call("GlobalSource", "setAudioSource", {4, -1});
+        m_vehicle->ring(QStringLiteral("+1 555 0100"));
+        QCOMPARE(number("CDSource", "cdStatus"), 3);
+        call("PhoneSource", "rejectCall");
+        QCOMPARE(number("CDSource", "cdStatus"), 2);
+        call("CDSource", "togglePlayPause", {3});
+        m_vehicle->ring(QStringLiteral("+1 555 0100"));
+        call("PhoneSource", "rejectCall");
+        QCOMPARE(number("CDSource", "cdStatus"), 3); // it did not play before
+    }
+
+    void theDiscThatPlaysIsTakenOut()
+    {
+        call("GlobalSource", "setAudioSource", {16, -1});
+        call("GlobalSource", "setAudioSource", {4, -1});
+        m_vehicle->ejectDisc();
+        QCOMPARE(number("GlobalSource", "mainAudioSource"), 16);
+        QCOMPARE(value("MediaAudioSource", "playing"), QJsonValue(true));
+    }
+
+    void discIsWound()
+    {
+        call("GlobalSource", "setAudioSource", {4, -1});
+        call("GlobalSource", "sendLongSeekUp");
+        m_vehicle->advance(1000);
+        call("GlobalSource", "sendLongReleasedSeekUp");
+        QCOMPARE(number("CDSource", "position"), 21);
+    }
+
+    void projectedPhoneIsASourceOfSoundWhileItIsThere_data()
+    {
+        QTest::addColumn<int>("mode");
+        QTest::addColumn<int>("source");
+        QTest::newRow("wired") << 1 << 34;
+        QTest::newRow("wireless") << 2 << 35;
+    }
+
+    void projectedPhoneIsASourceOfSoundWhileItIsThere()
+    {
+        QFETCH(int, mode);
+        QFETCH(int, source);
+        call("GlobalSource", "setAudioSource", {16, -1});
+        call("GlobalSource", "setAudioSource", {source, -1});
+        QCOMPARE(number("GlobalSource", "mainAudioSource"), 16);
+        m_vehicle->setProjectionMode(mode);
+        call("GlobalSource", "setAudioSource", {69 - source, -1});
+        QCOMPARE(number("GlobalSource", "mainAudioSource"), 16);
+        call("GlobalSource", "setAudioSource", {12, -1});
+        QCOMPARE(number("GlobalSource", "mainAudioSource"), source);
+        QCOMPARE(value("ProjectionSource", "projectedPlaying"), QJsonValue(true));
+        m_vehicle->setProjectionMode(0);
+        QCOMPARE(number("GlobalSource", "mainAudioSource"), 16);
+        QCOMPARE(value("ProjectionSource", "projectedPlaying"), QJsonValue(false));
+        QCOMPARE(textOf("ProjectionSource", "projectedTitle"), QString());
+    }
+
+    void projectedPhoneUnderstandsKeys()
+    {
+        const auto press = [this](int key) {
+            call("ProjectionSource", "projectionButtonPress", {key});
+            call("ProjectionSource", "projectionButtonRelease", {key});
+            call("ProjectionSource", "projectionButtonLongPress", {key, false});
+        };
+        m_vehicle->setProjectionMode(1);
+        call("GlobalSource", "setAudioSource", {34, -1});
+        const QString first = textOf("ProjectionSource", "projectedTitle");
+        press(89);
+        const QString second = textOf("ProjectionSource", "projectedTitle");
+        QVERIFY(first != second);
+        press(88);
+        QCOMPARE(textOf("ProjectionSource", "projectedTitle"), first);
+        press(83);
+        QCOMPARE(value("ProjectionSource", "projectedPlaying"), QJsonValue(false));
+        call("ProjectionSource", "projectionButtonPress", {89});
+        call("ProjectionSource", "projectionButtonLongPress", {89, true});
+        call("ProjectionSource", "projectionButtonRelease", {89});
+        QCOMPARE(textOf("ProjectionSource", "projectedTitle"), first); // held: something else
+        m_vehicle->ringProjectedPhone();
+        QCOMPARE(number("ProjectionSource", "dioCallStatus"), 1);
+        press(79);
+        QCOMPARE(number("ProjectionSource", "dioCallStatus"), 2);
+        press(80);
+        QCOMPARE(number("ProjectionSource", "dioCallStatus"), 0);
+        press(2000000000);
+    }
+
+    void voiceSessionGoesOnToACall()
+    {
+        call("GlobalSource", "sendPressedVoicePTTKey");
+        m_vehicle->hear(QStringLiteral("call"));
+        QCOMPARE(number("SpeechSource", "sessionState"), 2);
+        m_vehicle->hear(QStringLiteral("dana whitfield"));
+        QCOMPARE(number("SpeechSource", "sessionState"), 3);
+        QVERIFY(textOf("SpeechSource", "promptText").contains(QStringLiteral("dana whitfield")));
+        m_vehicle->hear(QStringLiteral("yes"));
+        QCOMPARE(number("SpeechSource", "sessionState"), 0);
+        QCOMPARE(value("PhoneSource", "dialling"), QJsonValue(true));
+        QCOMPARE(textOf("PhoneSource", "callerNumber"), QStringLiteral("+1 555 0100"));
+        m_vehicle->answerFarEnd();
+        QCOMPARE(value("PhoneSource", "callConnected"), QJsonValue(true));
+        m_vehicle->hangUpFarEnd();
+        QCOMPARE(value("PhoneSource", "callConnected"), QJsonValue(false));
+    }
+
+    void heldPushToTalkReachesThePhonesVoiceService()
+    {
+        call("GlobalSource", "sendLongPressedVoicePTTKey");
+        QCOMPARE(value("PhoneSource", "phoneVoiceServiceActive"), QJsonValue(true));
+        m_vehicle->advance(8000);
+        QCOMPARE(value("PhoneSource", "phoneVoiceServiceActive"), QJsonValue(false));
+        m_vehicle->setPhoneConnected(false);
+        call("GlobalSource", "sendLongPressedVoicePTTKey");
+        QCOMPARE(number("SpeechSource", "sessionState"), 1);
+    }
+
+    void phonesAssistantListensForAWhile()
+    {
+        call("PhoneSource", "toggleSiriActivation", {true});
+        QCOMPARE(value("PhoneSource", "siriActive"), QJsonValue(true));
+        m_vehicle->advance(8000);
+        QCOMPARE(value("PhoneSource", "siriActive"), QJsonValue(false));
+        m_vehicle->setState(QStringLiteral("PhoneSource"), QStringLiteral("siriEnabled"), false);
+        call("PhoneSource", "toggleSiriActivation", {true});
+        QCOMPARE(value("PhoneSource", "siriActive"), QJsonValue(false));
+    }
+
+    void withoutAPhoneNothingRings()
+    {
+        m_vehicle->setPhoneConnected(false);
+        m_vehicle->ring(QStringLiteral("+1 555 0100"));
+        call("PhoneSource", "dial", {QStringLiteral("+1 555 0100")});
+        QCOMPARE(value("PhoneSource", "incomingCall"), QJsonValue(false));
+        QCOMPARE(value("PhoneSource", "dialling"), QJsonValue(false));
+    }
+
+    void powerOffIsSilent()
+    {
+        call("GlobalSource", "setAudioSource", {16, -1});
+        call("GlobalSource", "sendPowerOnOffKeyPressed");
+        QCOMPARE(value("MediaAudioSource", "playing"), QJsonValue(false));
+        call("GlobalSource", "sendPowerOnOffKeyPressed");
+        QCOMPARE(value("MediaAudioSource", "playing"), QJsonValue(true));
+    }
+
+    /// Every field at the ends of its range, then everything that the vehicle does about it.
+    void anySwitchCanBeSetWithoutHarm()
+    {
+        const QJsonArray values{true,
+                                false,
+                                0,
+                                1,
+                                -1,
+                                2,
+                                7,
+                                12,
+                                34,
+                                99,
+                                1000000,
+                                2147483647,
+                                -2147483647 - 1,
+                                0.5,
+                                60.0,
+                                QString(),
+                                QStringLiteral("x"),
+                                QStringLiteral("98.5"),
+                                QJsonArray()};
+        const CallTable& table = CallTable::instance();
+        const QStringList sources = table.sources();
+        int done = 0;
+        for (const QString& source : sources) {
+            const QStringList fields = table.stateOf(source);
+            for (const QString& field : fields) {
+                for (const QJsonValue tried : values) {
+                    done += m_vehicle->setState(source, field, tried);
+                    for (const char* const answer :
+                         {"sendShortSeekUp", "sendLongSeekDown", "sendPressedTuneUpKey", "sendLongReleasedSeekDown"})
+                        call("GlobalSource", answer);
+                    call("GlobalSource", "sendShortPresetKey", {6});
+                    call("GlobalSource", "sendLongPresetKey", {6});
+                    m_vehicle->advance(1000);
+                    QVERIFY(table.checkState(source, field, m_vehicle->state(source).value(field)).isEmpty());
+                }
+            }
+        }
+        QVERIFY(done > 200);
+        call("GlobalSource", "setVolume", {-2147483647 - 1});
+        QCOMPARE(number("GlobalSource", "volume"), 0);
+        call("GlobalSource", "setVolume", {2147483647});
+        QCOMPARE(number("GlobalSource", "volume"), 40);
     }
 
     void mediaPlaysOnWhileItIsTheSource()
@@ -459,6 +811,14 @@ private Q_SLOTS:
     {
         QVERIFY(m_vehicle->setState(QStringLiteral("GlobalSource"), QStringLiteral("nightMode"), true));
         QCOMPARE(value("GlobalSource", "nightMode"), QJsonValue(true));
+        QVERIFY(m_vehicle->setState(QStringLiteral("GlobalSource"), QStringLiteral("mainAudioSource"), 16));
+        QCOMPARE(value("MediaAudioSource", "playing"), QJsonValue(true));
+        QVERIFY(m_vehicle->setState(QStringLiteral("GlobalSource"), QStringLiteral("mainAudioSource"), 5));
+        call("GlobalSource", "sendShortSeekUp"); // a source without a model
+        QVERIFY(!m_vehicle->setState(QStringLiteral("GlobalSource"), QStringLiteral("mainAudioSource"), 34));
+        QVERIFY(!m_vehicle->setState(QStringLiteral("GlobalSource"), QStringLiteral("volume"), 41));
+        QVERIFY(
+            !m_vehicle->setState(QStringLiteral("FMTunerSource"), QStringLiteral("frequency"), QStringLiteral("5")));
         QVERIFY(!m_vehicle->setState(QStringLiteral("GlobalSource"), QStringLiteral("wings"), true));
         QVERIFY(!m_vehicle->setState(QStringLiteral("BoatSource"), QStringLiteral("nightMode"), true));
     }

@@ -11,6 +11,7 @@
 #include <QTest>
 
 #include <memory>
+#include <thread>
 #include <poll.h>
 #include <sys/socket.h>
 #include <sys/stat.h>
@@ -164,9 +165,9 @@ private Q_SLOTS:
     {
         const int stalled = connectGreeted();
         const int good = connectGreeted();
-        for (int i = 0; i < 200; ++i) {
+        for (int i = 0; i < 12000; ++i) {
             m_service->vehicle().setState(QStringLiteral("FMTunerSource"), QStringLiteral("radioText"),
-                                          QString(60000, QLatin1Char(char('a' + i % 2))));
+                                          QString(1000, QLatin1Char(char('a' + i % 2))));
             char buffer[65536];
             while (::recv(good, buffer, sizeof buffer, 0) > 0)
                 QCoreApplication::processEvents();
@@ -174,6 +175,79 @@ private Q_SLOTS:
         QVERIFY(isCut(stalled));
         QVERIFY(m_log->takeOne(QtWarningMsg, QStringLiteral("HMI on messages left: it does not read")));
         QVERIFY(works(good));
+    }
+
+    void aFloodOfKeysReachesAnHmiThatReadsInOrder()
+    {
+        constexpr int steps = 333334; // more than a million events
+        const int hmi = connectHmi(Channel::Priority);
+        QVERIFY(write(hmi, "{\"protocol\":1,\"peer\":\"hmi\"}\n"));
+        QVERIFY(!readUntil(hmi, "\n").isEmpty());
+        QSignalSpy greeted(m_service.get(), &VehicleService::keySent);
+        QVERIFY(QTest::qWaitFor([&] {
+            m_service->vehicle().keyEvent(1, 0);
+            pollfd descriptor{hmi, POLLIN, 0};
+            return ::poll(&descriptor, 1, 0) == 1;
+        }));
+        const QByteArray begin = readUntil(hmi, "\n");
+        QVERIFY(!begin.isEmpty());
+        qint64 received = 0;
+        bool inOrder = true;
+        std::thread reader([&] {
+            QByteArray partial;
+            char buffer[65536];
+            while (received < 3 * steps) {
+                pollfd descriptor{hmi, POLLIN, 0};
+                if (::poll(&descriptor, 1, 20000) != 1)
+                    return;
+                const auto count = ::recv(hmi, buffer, sizeof buffer, 0);
+                if (count <= 0)
+                    return;
+                partial.append(buffer, int(count));
+                int from = 0;
+                for (int end; (end = int(partial.indexOf('\n', from))) >= 0; from = end + 1) {
+                    const QByteArray line = partial.mid(from, end - from);
+                    if (line.contains("[1,0]"))
+                        continue;
+                    inOrder = inOrder && line.contains("[54," + QByteArray::number(received % 3) + ']');
+                    ++received;
+                }
+                partial.remove(0, from);
+            }
+        });
+        const KeyInput::Owner owner = KeyInput::newOwner();
+        for (int i = 0; i < steps; ++i)
+            if (!m_service->vehicle().keys().turn(54, 1, owner))
+                break;
+        QVERIFY(QTest::qWaitFor([&] { return m_service->waitingBytes() == 0; }, 20000));
+        reader.join();
+        QCOMPARE(received, 3LL * steps);
+        QVERIFY(inOrder);
+    }
+
+    void thePanelHearsWhatHappens()
+    {
+        QSignalSpy states(m_service.get(), &VehicleService::stateChanged);
+        QSignalSpy keys(m_service.get(), &VehicleService::keySent);
+        QSignalSpy decisions(m_service.get(), &VehicleService::decisionReported);
+        m_service->vehicle().setState(QStringLiteral("DeveloperSource"), QStringLiteral("decisionsWanted"), true);
+        QCOMPARE(states.size(), 1);
+        QCOMPARE(states.constFirst().constFirst().toString(), QStringLiteral("DeveloperSource"));
+        m_service->vehicle().keyEvent(200, 9);
+        QCOMPARE(keys, QList<QVariantList>({{200, 9}}));
+        const int hmi = connectGreeted();
+        QVERIFY(write(hmi, "{\"source\":\"DeveloperSource\",\"call\":\"reportDecision\",\"args\":[\"because\"]}\n"));
+        QTRY_COMPARE(decisions, QList<QVariantList>({{QStringLiteral("because")}}));
+    }
+
+    void fencesAreSentWhereEventsAreAndTheirAnswerIsTold()
+    {
+        const int messages = connectGreeted();
+        QSignalSpy reached(m_service.get(), &VehicleService::fenceReached);
+        m_service->vehicle().sendFence(Channel::Messages, 7);
+        QVERIFY(readUntil(messages, "\n").contains("\"event\":\"fence\",\"source\":\"DeveloperSource\""));
+        QVERIFY(write(messages, "{\"source\":\"DeveloperSource\",\"call\":\"fenceReached\",\"args\":[7]}\n"));
+        QTRY_COMPARE(reached, QList<QVariantList>({{7}}));
     }
 
     void notMoreThanEightOnAChannel()
@@ -196,7 +270,7 @@ private Q_SLOTS:
             {};
             QCOMPARE(::stat(QFile::encodeName(path).constData(), &status), 0);
             QCOMPARE(status.st_mode & 0777, mode_t(0700));
-            QCOMPARE(QDir(path).entryList(QDir::System | QDir::Files).size(), 3);
+            QCOMPARE(QDir(path).entryList(QDir::System | QDir::Files).size(), 4);
 
             VehicleDirectory second;
             QVERIFY(!second.listen(path));

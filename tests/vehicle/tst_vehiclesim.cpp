@@ -24,7 +24,8 @@ private:
     static bool socketsExist(const QString& directory)
     {
         return QDir(directory).entryList(QDir::System)
-               == QStringList({QStringLiteral("messages"), QStringLiteral("priority"), QStringLiteral("touch")});
+               == QStringList({QStringLiteral("control"), QStringLiteral("messages"), QStringLiteral("priority"),
+                               QStringLiteral("touch")});
     }
 
 private Q_SLOTS:

@@ -1,15 +1,26 @@
 // SPDX-License-Identifier: MIT
-#include <HmiVehicle/vehicledirectory.h>
-#include <HmiVehicle/vehicleservice.h>
+#include "commandrunner.h"
+#include "desktop.h"
+#include "devices.h"
+#include "exitcodes.h"
+#include "options.h"
+#include "player.h"
+#include "server.h"
 
-#include <QCommandLineParser>
-#include <QCoreApplication>
+#include <HmiVehicle/controlpanel.h>
+
+#include <QGuiApplication>
 #include <QSocketNotifier>
 #include <QTextStream>
+#include <QTime>
 
+#include <algorithm>
 #include <csignal>
+#include <memory>
 #include <sys/signalfd.h>
 #include <unistd.h>
+
+using HmiVehicle::ControlPanel;
 
 namespace {
 
@@ -24,42 +35,96 @@ int openEndSignals()
     return ::signalfd(-1, &signalsToEnd, SFD_CLOEXEC | SFD_NONBLOCK);
 }
 
+int serve(const Options& options)
+{
+    HmiVehicle::Vehicle::Options vehicle;
+    vehicle.frozen = options.frozen;
+    vehicle.speed = options.speed;
+    if (!options.frozen)
+        vehicle.startTime = QTime::currentTime();
+    Server server(vehicle);
+    if (!server.listen(options.directory)) {
+        QTextStream(stderr) << "vehicle-sim: " << server.errorString() << '\n';
+        return failed;
+    }
+    QObject extras; // goes before the service
+    QString problem = useDevices(options.devices, options.keyMap, server.service(), &extras);
+    if (problem.isEmpty())
+        problem = useDesktop(options.desktopPlayer, options.modem, server.service(), &extras);
+    if (!problem.isEmpty()) {
+        QTextStream(stderr) << "vehicle-sim: " << problem << '\n';
+        return failed;
+    }
+    ControlPanel panel(server.service());
+    if (options.panel && !panel.show())
+        return failed;
+    QTextStream(stdout) << "vehicle-sim serves " << options.directory << '\n' << Qt::flush;
+    if (!options.pictureFile.isEmpty())
+        return panel.savePicture(options.pictureFile) ? 0 : failed;
+    return QCoreApplication::exec();
+}
+
+int send(const Options& options)
+{
+    CommandRunner::Steps steps;
+    for (const QStringList& words : options.commands)
+        steps.push_back({QString(), words, options.timeout});
+    CommandRunner runner(steps);
+    QObject::connect(&runner, &CommandRunner::finished, [](bool done) { QCoreApplication::exit(done ? 0 : failed); });
+    return runner.start(options.directory) ? QCoreApplication::exec() : failed;
+}
+
+int play(const Options& options)
+{
+    Player player(options);
+    QObject::connect(&player, &Player::finished, [](int code) { QCoreApplication::exit(code); });
+    const int problem = player.start();
+    return problem ? problem : QCoreApplication::exec();
+}
+
+int run(const Options& options)
+{
+    switch (options.task) {
+    case Options::Serve:
+        return serve(options);
+    case Options::Send:
+        return send(options);
+    case Options::Play:
+        return play(options);
+    case Options::ShowHelp:
+        QTextStream(stdout) << options.message;
+    }
+    return 0;
+}
+
+/// A display is needed by the panel only. The options can be read when there is an application, so their beginning has to do.
+std::unique_ptr<QCoreApplication> makeApplication(int& argc, char** argv)
+{
+    const auto asksFor = [argc, argv](const char* option) {
+        return std::any_of(argv, argv + argc,
+                           [option](const char* word) { return qstrncmp(word, option, uint(qstrlen(option))) == 0; });
+    };
+    if (!asksFor("--panel"))
+        return std::make_unique<QCoreApplication>(argc, argv);
+    if (asksFor("--panel-shot")) {
+        qputenv("QT_QPA_PLATFORM", "offscreen");
+        qputenv("QT_QUICK_BACKEND", "software");
+    }
+    return std::make_unique<QGuiApplication>(argc, argv);
+}
+
 } // namespace
 
 int main(int argc, char** argv)
 {
-    QCoreApplication application(argc, argv);
+    const std::unique_ptr<QCoreApplication> application = makeApplication(argc, argv);
     QCoreApplication::setApplicationName(QStringLiteral("vehicle-sim"));
-    QCommandLineParser parser;
-    parser.setApplicationDescription(
-        QStringLiteral("A simulated vehicle: the application layer that an HMI connects to."));
-    parser.addHelpOption();
-    const QCommandLineOption directoryOption(QStringLiteral("dir"), QStringLiteral("Directory of the sockets."),
-                                             QStringLiteral("directory"), HmiVehicle::VehicleDirectory::defaultPath());
-    const QCommandLineOption frozenOption(QStringLiteral("frozen"), QStringLiteral("Let time stand still at 10:42."));
-    parser.addOption(directoryOption);
-    parser.addOption(frozenOption);
-    parser.process(application);
-    if (!parser.positionalArguments().isEmpty()) {
-        QTextStream(stderr) << "vehicle-sim: unexpected argument: " << parser.positionalArguments().constFirst()
-                            << '\n';
-        return 2;
-    }
-
-    HmiVehicle::Vehicle::Options options;
-    options.frozen = parser.isSet(frozenOption);
-    if (!options.frozen)
-        options.startTime = QTime::currentTime();
-    HmiVehicle::VehicleService service(options);
-    HmiVehicle::VehicleDirectory directory;
-    QObject::connect(&directory, &HmiVehicle::VehicleDirectory::connected, &service,
-                     &HmiVehicle::VehicleService::addConnection);
-    if (!directory.listen(parser.value(directoryOption))) {
-        QTextStream(stderr) << "vehicle-sim: " << directory.errorString() << '\n';
-        return 1;
+    Options options;
+    if (!options.parse(QCoreApplication::arguments())) {
+        QTextStream(stderr) << "vehicle-sim: " << options.message << '\n';
+        return wrongUsage;
     }
     QSocketNotifier endSignal(openEndSignals(), QSocketNotifier::Read);
-    QObject::connect(&endSignal, &QSocketNotifier::activated, &application, &QCoreApplication::quit);
-    QTextStream(stdout) << "vehicle-sim serves " << parser.value(directoryOption) << '\n' << Qt::flush;
-    return application.exec();
+    QObject::connect(&endSignal, &QSocketNotifier::activated, application.get(), &QCoreApplication::quit);
+    return run(options);
 }

@@ -7,6 +7,8 @@ namespace HmiVehicle {
 
 void AudioModel::activate(int) {}
 void AudioModel::deactivate() {}
+void AudioModel::interrupt() {}
+void AudioModel::goOn() {}
 void AudioModel::seek(Step) {}
 void AudioModel::startWinding(Step) {}
 void AudioModel::stopWinding() {}

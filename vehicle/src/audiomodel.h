@@ -11,9 +11,11 @@ enum class Step { Down = -1, Up = 1 };
 class AudioModel : public Model
 {
 public:
-    virtual bool canPlay() const { return true; }
-    virtual void activate(int instance); ///< it becomes the main source; \a instance -1 for the last one
+    virtual bool canPlay(int) const { return true; } ///< as the source of that number
+    virtual void activate(int instance);             ///< it becomes the main source; \a instance -1 for the last one
     virtual void deactivate();
+    virtual void interrupt(); ///< something more important is heard for a while
+    virtual void goOn();      ///< after that
     virtual void seek(Step step);
     virtual void startWinding(Step step); ///< the seek key is held
     virtual void stopWinding();

@@ -2,6 +2,7 @@
 #include "cdmodel.h"
 
 #include <iterator>
+#include <utility>
 
 namespace HmiVehicle {
 
@@ -10,6 +11,9 @@ namespace {
 enum Status { NoDisc = 0, Loading = 1, Playing = 2, Paused = 3 };
 
 constexpr int loadingTime = 2500;
+constexpr int windStep = 5;          ///< seconds
+constexpr int windTime = 250;        ///< milliseconds
+constexpr int longestTime = 1000000; ///< seconds
 
 struct Track
 {
@@ -32,33 +36,39 @@ CdModel::CdModel(Scheduler& scheduler)
     showTrack(1);
     on("togglePlayPause", [this](const QJsonArray& arguments) {
         const int status = arguments.at(0).toInt();
-        if (canPlay() && (status == Playing || status == Paused))
+        if (hasDisc() && (status == Playing || status == Paused))
             setStatus(status);
     });
     on("nextTrack", [this] { seek(Step::Up); });
     on("previousTrack", [this] { seek(Step::Down); });
 }
 
-bool CdModel::canPlay() const
+bool CdModel::canPlay(int) const
+{
+    return hasDisc();
+}
+
+bool CdModel::hasDisc() const
 {
     return value("cdStatus").toInt() >= Playing;
 }
 
 void CdModel::activate(int)
 {
-    if (canPlay())
+    if (hasDisc())
         setStatus(Playing);
 }
 
 void CdModel::deactivate()
 {
-    if (canPlay())
+    stopWinding();
+    if (hasDisc())
         setStatus(Paused);
 }
 
 void CdModel::seek(Step step)
 {
-    if (canPlay())
+    if (hasDisc())
         showTrack(value("track").toInt() + int(step));
 }
 
@@ -67,7 +77,7 @@ void CdModel::setStatus(int status)
     set("cdStatus", status);
     scheduler().cancel(&m_clock);
     if (status == Playing)
-        m_clock = scheduler().every(1000, [this] { playOn(); });
+        m_clock = scheduler().every(1000, [this] { move(1); });
 }
 
 void CdModel::showTrack(int track)
@@ -79,18 +89,65 @@ void CdModel::showTrack(int track)
     set("position", 0);
 }
 
-void CdModel::playOn()
+void CdModel::move(int seconds)
 {
-    const int position = value("position").toInt() + 1;
+    const int position = value("position").toInt() + seconds;
     if (position >= value("duration").toInt())
         showTrack(value("track").toInt() + 1);
     else
-        set("position", position);
+        set("position", qMax(0, position));
+}
+
+void CdModel::startWinding(Step step)
+{
+    stopWinding();
+    if (hasDisc())
+        m_winding = scheduler().every(windTime, [this, step] { move(windStep * int(step)); });
+}
+
+void CdModel::stopWinding()
+{
+    scheduler().cancel(&m_winding);
+}
+
+void CdModel::interrupt()
+{
+    m_interrupted = value("cdStatus").toInt() == Playing;
+    if (m_interrupted)
+        setStatus(Paused);
+}
+
+void CdModel::goOn()
+{
+    if (std::exchange(m_interrupted, false) && value("cdStatus").toInt() == Paused)
+        setStatus(Playing);
+}
+
+bool CdModel::assign(const QString& field, const QJsonValue& wanted)
+{
+    const int number = wanted.toInt();
+    if (field == QLatin1String("cdStatus")) {
+        if (number == NoDisc)
+            eject();
+        else if (number == Loading)
+            insert();
+        else if (hasDisc())
+            setStatus(number);
+        return number < Playing || hasDisc();
+    }
+    if (field == QLatin1String("track")) {
+        if (hasDisc() && number >= 1 && number <= trackCount)
+            showTrack(number);
+        return value("track").toInt() == number;
+    }
+    const bool isTime = field == QLatin1String("position") || field == QLatin1String("duration");
+    return (!isTime || number <= longestTime) && AudioModel::assign(field, wanted);
 }
 
 void CdModel::eject()
 {
     scheduler().cancel(&m_loading);
+    stopWinding();
     setStatus(NoDisc);
     for (const char* const field : {"track", "trackCount", "position", "duration"})
         set(field, 0);
@@ -100,6 +157,8 @@ void CdModel::eject()
 
 void CdModel::insert()
 {
+    scheduler().cancel(&m_loading);
+    stopWinding();
     setStatus(Loading);
     m_loading = scheduler().answerAfter(loadingTime, [this] {
         m_loading = 0;

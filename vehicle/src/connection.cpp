@@ -5,8 +5,10 @@
 #include <QPointer>
 
 #include <cerrno>
+#include <poll.h>
 #include <sys/socket.h>
 #include <unistd.h>
+#include <utility>
 
 namespace HmiVehicle {
 
@@ -17,12 +19,13 @@ constexpr int chunk = 64 * 1024;
 constexpr int maximumWaiting = 4 * 1024 * 1024; ///< bytes that the peer has not read; more means that it stalls
 constexpr int maximumComplaints = 20;
 constexpr int greetingTime = 2000;
+constexpr int stallTime = 1000; ///< without reading anything
 } // namespace
 
-Connection::Connection(int socket, Channel channel, QObject* parent)
+Connection::Connection(int socket, Peer peer, QObject* parent)
     : QObject(parent)
     , m_socket(socket)
-    , m_channel(channel)
+    , m_peer(std::move(peer))
     , m_readable(socket, QSocketNotifier::Read)
     , m_writable(socket, QSocketNotifier::Write)
 {
@@ -41,34 +44,49 @@ Connection::~Connection()
 void Connection::start()
 {
     m_greetingTimer = startTimer(greetingTime);
-    send(greetingLine());
+    send(m_peer.ownGreeting);
 }
 
 void Connection::send(const QByteArray& lines)
 {
     if (!m_open)
         return;
+    const bool wasWaiting = waiting() > 0; // then it is said when more can be sent
     m_waiting += lines;
-    flush();
-    if (m_waiting.size() > maximumWaiting)
+    if (!wasWaiting)
+        flush();
+    if (waiting() > maximumWaiting && !drain())
         hangUp(QStringLiteral("it does not read"));
+}
+
+/// Waits until there is room again. False when the peer reads nothing for a while.
+bool Connection::drain()
+{
+    while (m_open && waiting() > maximumWaiting / 2) {
+        pollfd descriptor{m_socket, POLLOUT, 0};
+        const int count = ::poll(&descriptor, 1, stallTime);
+        if (count == 0)
+            return false;
+        flush();
+    }
+    return m_open;
 }
 
 void Connection::flush()
 {
-    int sent = 0;
-    while (sent < m_waiting.size()) {
-        const auto count = ::send(m_socket, m_waiting.constData() + sent, size_t(m_waiting.size() - sent),
-                                  MSG_NOSIGNAL | MSG_DONTWAIT);
+    while (waiting() > 0) {
+        const auto count =
+            ::send(m_socket, m_waiting.constData() + m_sent, size_t(waiting()), MSG_NOSIGNAL | MSG_DONTWAIT);
         if (count > 0)
-            sent += int(count);
+            m_sent += int(count);
         else if (errno == EAGAIN || errno == EWOULDBLOCK)
             break;
         else if (errno != EINTR)
             return hangUp();
     }
-    m_waiting.remove(0, sent);
-    m_writable.setEnabled(!m_waiting.isEmpty());
+    if (m_sent * 2 >= m_waiting.size()) // seldom, because it moves what is left
+        m_waiting.remove(0, std::exchange(m_sent, 0));
+    m_writable.setEnabled(waiting() > 0);
 }
 
 void Connection::readSome()
@@ -83,12 +101,14 @@ void Connection::readSome()
     const QPointer<Connection> self(this);
     int begin = 0;
     for (int end; (end = int(m_partial.indexOf('\n', begin))) >= 0; begin = end + 1) {
+        if (end - begin >= m_peer.maximumLine)
+            return hangUp(QStringLiteral("its line is too long"));
         takeLine(m_partial.mid(begin, end - begin));
         if (!self || !m_open)
             return;
     }
     m_partial.remove(0, begin);
-    if (m_partial.size() >= maximumLine)
+    if (m_partial.size() >= m_peer.maximumLine)
         hangUp(QStringLiteral("its line is too long"));
 }
 
@@ -96,12 +116,12 @@ void Connection::takeLine(const QByteArray& line)
 {
     if (m_greeted) {
         Q_EMIT lineReceived(line);
-    } else if (line == "{\"protocol\":1,\"peer\":\"hmi\"}" || line == "{\"peer\":\"hmi\",\"protocol\":1}") {
+    } else if (m_peer.greetings.contains(line)) {
         m_greeted = true;
         killTimer(m_greetingTimer);
         Q_EMIT greetedByPeer();
     } else {
-        hangUp(QStringLiteral("it does not greet as an HMI of protocol 1"));
+        hangUp(QStringLiteral("it does not greet as ") + m_peer.protocol);
     }
 }
 
@@ -114,7 +134,7 @@ void Connection::timerEvent(QTimerEvent*)
 void Connection::complain(const QString& problem)
 {
     if (m_complaints++ < maximumComplaints)
-        qCWarning(vehicleLog).noquote() << "Line refused on" << channelName(m_channel) + QLatin1Char(':') << problem;
+        qCWarning(vehicleLog).noquote() << "Line refused:" << m_peer.name + QLatin1Char(':') << problem;
 }
 
 void Connection::hangUp(const QString& reason)
@@ -126,7 +146,7 @@ void Connection::hangUp(const QString& reason)
     m_writable.setEnabled(false);
     ::shutdown(m_socket, SHUT_RDWR);
     if (!reason.isEmpty())
-        qCWarning(vehicleLog).noquote() << "HMI on" << channelName(m_channel) << "left:" << reason;
+        qCWarning(vehicleLog).noquote() << m_peer.name << "left:" << reason;
     Q_EMIT closed();
     deleteLater();
 }

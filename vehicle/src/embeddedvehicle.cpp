@@ -106,11 +106,16 @@ int EmbeddedVehicle::connectChannel(const QString& name)
 
 void EmbeddedVehicle::run(std::function<void(Vehicle&)> action)
 {
+    runInService([action = std::move(action)](VehicleService& service) { action(service.vehicle()); });
+}
+
+void EmbeddedVehicle::runInService(std::function<void(VehicleService&)> action)
+{
     const std::lock_guard<std::mutex> lock(m_running->mutex);
     VehicleService* const service = m_running->service;
     if (service)
         QMetaObject::invokeMethod(
-            service, [service, action = std::move(action)] { action(service->vehicle()); }, Qt::QueuedConnection);
+            service, [service, action = std::move(action)] { action(*service); }, Qt::QueuedConnection);
 }
 
 } // namespace HmiVehicle

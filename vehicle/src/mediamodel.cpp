@@ -2,14 +2,17 @@
 #include "mediamodel.h"
 
 #include <iterator>
+#include <utility>
 
 namespace HmiVehicle {
 
 namespace {
 
-constexpr int restartLimit = 3; ///< seconds; later "previous" goes to the start of the track
-constexpr int windStep = 5;     ///< seconds
-constexpr int windTime = 250;   ///< milliseconds
+constexpr int restartLimit = 3;      ///< seconds; later "previous" goes to the start of the track
+constexpr int windStep = 5;          ///< seconds
+constexpr int windTime = 250;        ///< milliseconds
+constexpr int longestTime = 1000000; ///< seconds
+constexpr int longestText = 256;
 
 struct Track
 {
@@ -60,18 +63,62 @@ MediaModel::MediaModel(Scheduler& scheduler)
     set("playing", false);
     showTrack(0);
     on("togglePlayPause", [this] { setPlaying(!value("playing").toBool()); });
-    on("next", [this] { showTrack(value("trackIndex").toInt() + 1); });
+    on("next", [this] { next(); });
     on("previous", [this] { previous(); });
     on("playTrack", [this](const QJsonArray& arguments) {
         const int index = arguments.at(0).toInt();
-        if (index < 0 || index >= trackCount)
+        if (m_remote || index < 0 || index >= trackCount)
             return;
         showTrack(index);
         setPlaying(true);
     });
-    on("seekTo", [this](const QJsonArray& arguments) {
-        set("position", qBound(0, arguments.at(0).toInt(), value("duration").toInt()));
-    });
+    on("seekTo", [this](const QJsonArray& arguments) { seekTo(arguments.at(0).toInt()); });
+}
+
+void MediaModel::setRemote(MediaRemote* remote)
+{
+    const bool wasPlaying = value("playing").toBool();
+    setPlaying(false);
+    stopWinding();
+    m_interrupted = false;
+    m_remote = remote;
+    set("library", remote ? QJsonArray() : library());
+    if (remote) {
+        set("trackIndex", -1);
+        show(MediaShown());
+        return;
+    }
+    showTrack(0);
+    setPlaying(wasPlaying);
+}
+
+void MediaModel::show(const MediaShown& shown)
+{
+    if (!m_remote)
+        return;
+    set("playing", shown.playing);
+    set("title", shown.title.left(longestText));
+    set("artist", shown.artist.left(longestText));
+    set("album", shown.album.left(longestText));
+    set("duration", qBound(0, shown.duration, longestTime));
+    set("position", qBound(0, shown.position, longestTime));
+}
+
+void MediaModel::next()
+{
+    if (m_remote)
+        m_remote->next();
+    else
+        showTrack(value("trackIndex").toInt() + 1);
+}
+
+void MediaModel::seekTo(int position)
+{
+    const int bounded = qBound(0, position, value("duration").toInt());
+    if (m_remote)
+        m_remote->seekTo(bounded);
+    else
+        set("position", bounded);
 }
 
 void MediaModel::activate(int)
@@ -85,10 +132,39 @@ void MediaModel::deactivate()
     setPlaying(false);
 }
 
+void MediaModel::interrupt()
+{
+    m_interrupted = value("playing").toBool();
+    if (m_interrupted)
+        setPlaying(false);
+}
+
+void MediaModel::goOn()
+{
+    if (std::exchange(m_interrupted, false))
+        setPlaying(true);
+}
+
+bool MediaModel::assign(const QString& field, const QJsonValue& wanted)
+{
+    const int number = wanted.toInt();
+    if (field == QLatin1String("playing")) {
+        setPlaying(wanted.toBool());
+    } else if (field == QLatin1String("trackIndex")) {
+        if (m_remote || number < 0 || number >= trackCount)
+            return false;
+        showTrack(number);
+    } else {
+        const bool isTime = field == QLatin1String("position") || field == QLatin1String("duration");
+        return (!isTime || number <= longestTime) && AudioModel::assign(field, wanted);
+    }
+    return true;
+}
+
 void MediaModel::seek(Step step)
 {
     if (step == Step::Up)
-        showTrack(value("trackIndex").toInt() + 1);
+        next();
     else
         previous();
 }
@@ -106,6 +182,11 @@ void MediaModel::stopWinding()
 
 void MediaModel::setPlaying(bool playing)
 {
+    if (m_remote) {
+        if (playing != value("playing").toBool())
+            m_remote->setPlaying(playing);
+        return; // it tells when it does
+    }
     set("playing", playing);
     scheduler().cancel(&m_clock);
     if (playing)
@@ -127,6 +208,8 @@ void MediaModel::showTrack(int index)
 void MediaModel::move(int seconds)
 {
     const int position = value("position").toInt() + seconds;
+    if (m_remote)
+        return seekTo(position);
     if (position >= value("duration").toInt())
         return showTrack(value("trackIndex").toInt() + 1);
     set("position", qMax(0, position));
@@ -134,6 +217,8 @@ void MediaModel::move(int seconds)
 
 void MediaModel::previous()
 {
+    if (m_remote)
+        return m_remote->previous();
     if (value("position").toInt() > restartLimit)
         set("position", 0);
     else

@@ -33,12 +33,18 @@ void Model::set(const char* field, const QJsonValue& value)
     m_changes.insert(name, value);
 }
 
-void Model::on(const char* call, Handler handler)
+bool Model::assign(const QString& field, const QJsonValue& value)
 {
-    m_handlers.insert(QString::fromLatin1(call), std::move(handler));
+    set(field.toLatin1().constData(), value);
+    return true;
 }
 
-void Model::on(const char* call, std::function<void()> handler)
+void Model::on(const char* call, const Handler& handler)
+{
+    m_handlers.insert(QString::fromLatin1(call), handler);
+}
+
+void Model::on(const char* call, const std::function<void()>& handler)
 {
     on(call, [handler](const QJsonArray&) { handler(); });
 }

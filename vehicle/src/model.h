@@ -30,15 +30,18 @@ public:
 
     QJsonValue value(const char* field) const { return m_state.value(QLatin1String(field)); }
     void set(const char* field, const QJsonValue& value);
+    /// As a switch on a control panel does; the value has been checked against the table. False when it cannot be now.
+    virtual bool assign(const QString& field, const QJsonValue& value);
 
 protected:
     Model(const char* source, Scheduler& scheduler);
 
     using Handler = std::function<void(const QJsonArray& arguments)>;
-    void on(const char* call, Handler handler);
-    void on(const char* call, std::function<void()> handler);
+    void on(const char* call, const Handler& handler);
+    void on(const char* call, const std::function<void()>& handler);
 
     Scheduler& scheduler() { return m_scheduler; }
+    const Scheduler& scheduler() const { return m_scheduler; }
 
 private:
     const QString m_source;

@@ -19,6 +19,11 @@ int Scheduler::answerAfter(int milliseconds, Action action)
     return 0;
 }
 
+int Scheduler::after(int milliseconds, Action action)
+{
+    return add(milliseconds, 0, std::move(action));
+}
+
 int Scheduler::every(int milliseconds, Action action)
 {
     return m_frozen ? 0 : add(milliseconds, milliseconds, std::move(action));

@@ -22,6 +22,8 @@ public:
 
     /// Once, \a milliseconds from now; at once when frozen. The result cancels it, 0 when nothing is left to cancel.
     int answerAfter(int milliseconds, Action action);
+    /// Once, \a milliseconds from now, whether frozen or not: for what a finger does.
+    int after(int milliseconds, Action action);
     /// Again and again until cancelled; never when frozen.
     int every(int milliseconds, Action action);
     void cancel(int* task); ///< sets it to 0

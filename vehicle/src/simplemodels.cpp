@@ -1,15 +1,23 @@
 // SPDX-License-Identifier: MIT
 #include "simplemodels.h"
 
+#include <iterator>
+#include <utility>
+
 namespace HmiVehicle {
 
 namespace {
 constexpr int listeningTime = 8000;
 constexpr int notReadyPromptTime = 3000;
+constexpr int spokenTime = 6000;
+const char* const prompts[] = {"Please say a command", "Which name or number?", "Call %1? Say yes or no"};
+constexpr int stepCount = int(std::size(prompts));
+constexpr int maximumDecision = 4096; ///< UTF-16 units
 } // namespace
 
-SpeechModel::SpeechModel(Scheduler& scheduler)
+SpeechModel::SpeechModel(Scheduler& scheduler, Understood understood)
     : Model("SpeechSource", scheduler)
+    , m_understood(std::move(understood))
 {
     set("ttsSessionActive", false);
     set("voiceRecognitionEngineReady", true);
@@ -24,15 +32,59 @@ void SpeechModel::pushToTalk()
 {
     if (!value("voiceRecognitionEngineReady").toBool())
         return;
+    showStep(value("sessionState").toInt() + 1);
+}
+
+void SpeechModel::showStep(int step)
+{
+    if (step > stepCount)
+        return endSession();
     scheduler().cancel(&m_session);
-    set("sessionState", value("sessionState").toInt() + 1);
-    set("promptText", QStringLiteral("Please say a command"));
+    scheduler().cancel(&m_speaking);
+    set("ttsSessionActive", false);
+    set("sessionState", step);
+    set("promptText", QString::fromUtf8(prompts[step - 1]).replace(QLatin1String("%1"), m_heard));
     m_session = scheduler().every(listeningTime, [this] { endSession(); });
+}
+
+void SpeechModel::hear(const QString& text)
+{
+    const int step = value("sessionState").toInt();
+    if (step == 0)
+        return;
+    if (step < stepCount) {
+        m_heard = text;
+        return showStep(step + 1);
+    }
+    const QString wanted = m_heard;
+    endSession();
+    if (text.compare(QLatin1String("yes"), Qt::CaseInsensitive) == 0)
+        m_understood(wanted);
+}
+
+bool SpeechModel::assign(const QString& field, const QJsonValue& wanted)
+{
+    if (field == QLatin1String("sessionState")) {
+        const int step = wanted.toInt();
+        if (step < 0)
+            return false;
+        if (step > 0 && step <= stepCount)
+            showStep(step);
+        else
+            endSession();
+        set("sessionState", step); // a step that this vehicle does not know is the HMI's to bear
+    } else if (field == QLatin1String("ttsSessionActive")) {
+        speak(wanted.toBool() ? QStringLiteral("The tyre pressure is low") : QString(), spokenTime);
+    } else {
+        return Model::assign(field, wanted);
+    }
+    return true;
 }
 
 void SpeechModel::endSession()
 {
     scheduler().cancel(&m_session);
+    m_heard.clear();
     set("sessionState", 0);
     set("promptText", QString());
 }
@@ -41,24 +93,15 @@ void SpeechModel::speak(const QString& text, int milliseconds)
 {
     scheduler().cancel(&m_speaking);
     set("ttsSessionActive", !text.isEmpty());
-    set("promptText", text);
+    if (value("sessionState").toInt() == 0)
+        set("promptText", text);
     if (!text.isEmpty())
         m_speaking = scheduler().every(milliseconds, [this] { speak(QString(), 0); });
 }
 
-ProjectionModel::ProjectionModel(Scheduler& scheduler)
-    : Model("ProjectionSource", scheduler)
+bool SpeechModel::isHeard() const
 {
-    set("dioCallStatus", 0);
-    setMode(0);
-    for (const char* const call : {"projectionButtonPress", "projectionButtonRelease", "projectionButtonLongPress"})
-        on(call, [] {}); // the projected phone's own business
-}
-
-void ProjectionModel::setMode(int mode)
-{
-    set("projectionMode", mode);
-    set("projectedDeviceName", mode ? QStringLiteral("Dana's phone") : QString());
+    return value("sessionState").toInt() || value("ttsSessionActive").toBool();
 }
 
 EaPhoneModel::EaPhoneModel(Scheduler& scheduler)
@@ -78,6 +121,17 @@ DiagnosticsModel::DiagnosticsModel(Scheduler& scheduler)
     : Model("BezelDiagnosticsSource", scheduler)
 {
     set("bezelDiagnosticsActive", false);
+}
+
+DeveloperModel::DeveloperModel(Scheduler& scheduler, std::function<void(const QString&)> decision,
+                               std::function<void(int)> fence)
+    : Model("DeveloperSource", scheduler)
+{
+    set("decisionsWanted", false);
+    on("reportDecision", [decision = std::move(decision)](const QJsonArray& arguments) {
+        decision(arguments.at(0).toString().left(maximumDecision));
+    });
+    on("fenceReached", [fence = std::move(fence)](const QJsonArray& arguments) { fence(arguments.at(0).toInt()); });
 }
 
 KeyModel::KeyModel(Scheduler& scheduler)

@@ -8,26 +8,30 @@ namespace HmiVehicle {
 class SpeechModel : public Model
 {
 public:
-    explicit SpeechModel(Scheduler& scheduler);
+    /// Does what was understood in the end.
+    using Understood = std::function<void(const QString& text)>;
+
+    SpeechModel(Scheduler& scheduler, Understood understood);
 
     /// The push-to-talk key: starts a session, or goes on to its next step.
     void pushToTalk();
+    /// Somebody says something: the session goes on to its next step, or ends. Nothing happens without one.
+    void hear(const QString& text);
     void speak(const QString& text, int milliseconds);
+    /// A voice session runs or a text is spoken.
+    bool isHeard() const;
+
+    bool assign(const QString& field, const QJsonValue& value) override;
 
 private:
+    void showStep(int step);
     void endSession();
+
+    const Understood m_understood;
+    QString m_heard;
 
     int m_session = 0;
     int m_speaking = 0;
-};
-
-class ProjectionModel : public Model
-{
-public:
-    explicit ProjectionModel(Scheduler& scheduler);
-
-    /// \a mode 0 ends the session.
-    void setMode(int mode);
 };
 
 class EaPhoneModel : public Model
@@ -53,6 +57,14 @@ class KeyModel : public Model
 {
 public:
     explicit KeyModel(Scheduler& scheduler);
+};
+
+/// What developers of the HMI are told.
+class DeveloperModel : public Model
+{
+public:
+    DeveloperModel(Scheduler& scheduler, std::function<void(const QString& text)> decision,
+                   std::function<void(int number)> fence);
 };
 
 /// The layer behind the HMI; it only remembers what it was told.

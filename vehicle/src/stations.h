@@ -12,8 +12,9 @@ struct Station
     const char* frequency;
     const char* name; ///< UTF-8, as the texts
     const char* text;
-    int signal;   ///< per cent
-    bool traffic; ///< has traffic announcements
+    int signal;       ///< per cent
+    bool traffic;     ///< has traffic announcements
+    int programs = 0; ///< digital programmes besides the analogue one
 };
 
 struct Band

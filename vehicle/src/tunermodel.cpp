@@ -34,6 +34,7 @@ TunerModel::TunerModel(const Band& band, Scheduler& scheduler)
 void TunerModel::initialState()
 {
     set("autoStoreInProgress", false);
+    set("autoStoreProgress", 0);
     set("announcementType", 0);
     set("announcementText", QString());
     set("trafficAnnouncementEnabled", false);
@@ -54,11 +55,9 @@ void TunerModel::initialState()
 
 void TunerModel::addAnswers()
 {
-    on("tune", [this](const QJsonArray& arguments) { tuneTo(arguments.at(0).toString()); });
-    on("sendAutoStoreCancel", [this] {
-        scheduler().cancel(&m_autoStore);
-        set("autoStoreInProgress", false);
-    });
+    on("tune",
+       [this](const QJsonArray& arguments) { tuneToProgram(arguments.at(0).toString(), arguments.at(1).toString()); });
+    on("sendAutoStoreCancel", [this] { cancelAutoStore(); });
     on("cancelAnnouncement", [this] { endAnnouncement(); });
     on("toggleTpSeekInProgress",
        [this](const QJsonArray& arguments) { setTrafficAnnouncements(arguments.at(1).toBool()); });
@@ -70,15 +69,11 @@ void TunerModel::addAnswers()
         if (row >= 0 && row < int(m_band.stations.size()))
             tuneTo(text(m_band.stations[size_t(row)].frequency));
     });
-    on("startAutoStore", [this] {
-        set("autoStoreInProgress", true);
-        scheduler().cancel(&m_autoStore);
-        m_autoStore = scheduler().answerAfter(autoStoreTime, [this] { autoStore(); });
-    });
+    on("startAutoStore", [this] { startAutoStore(); });
 }
 
 /// A frequency off the raster or outside the band, or an unknown channel, leaves everything as it is.
-void TunerModel::tuneTo(const QString& frequency)
+bool TunerModel::tuneTo(const QString& frequency)
 {
     stopSeek();
     const auto found = std::find_if(m_band.stations.begin(), m_band.stations.end(),
@@ -89,12 +84,18 @@ void TunerModel::tuneTo(const QString& frequency)
     const bool isInBand =
         isNumber && m_band.step > 0 && number >= m_band.minimum && number <= m_band.maximum; // not for NaN
     if (!station && !isInBand)
-        return;
+        return false;
     set("frequency", station ? frequency : QString::number(number, 'f', m_band.decimals));
     const int row = station ? int(found - m_band.stations.begin()) : -1;
     const auto preset = station ? std::find(m_presets.begin(), m_presets.end(), row) : m_presets.end();
     set("activePreset", preset == m_presets.end() ? 0 : int(preset - m_presets.begin()) + 1);
     tuned(station);
+    return true;
+}
+
+void TunerModel::tuneToProgram(const QString& frequency, const QString&)
+{
+    tuneTo(frequency);
 }
 
 void TunerModel::tuned(const Station* station)
@@ -115,7 +116,7 @@ int TunerModel::stationIndex() const
 /// The station above or below what is tuned, round the ends of the band.
 int TunerModel::nextStation(Step step) const
 {
-    const int count = int(m_band.stations.size());
+    const int count = qMax(1, int(m_band.stations.size()));
     const int current = stationIndex();
     if (current >= 0)
         return (current + int(step) + count) % count;
@@ -126,12 +127,40 @@ int TunerModel::nextStation(Step step) const
     return (step == Step::Up ? above : above - 1 + count) % count;
 }
 
-void TunerModel::beginSeek(int stationToFind, const char* flag)
+void TunerModel::beginSeek(int stationToFind, Step step, const char* flag)
 {
     stopSeek();
     set(flag, true);
     const QString frequency = text(m_band.stations[size_t(stationToFind)].frequency);
-    m_seek = scheduler().answerAfter(seekTime, [this, frequency] { tuneTo(frequency); });
+    const int steps = stepsBetween(value("frequency").toString(), frequency, step);
+    if (steps < 2) {
+        m_seek = scheduler().answerAfter(seekTime, [this, frequency] { tuneTo(frequency); });
+    } else {
+        m_seek = scheduler().every(qMax(1, seekTime / steps), [this, frequency, step] { runTowards(frequency, step); });
+        if (!m_seek) // time stands still
+            tuneTo(frequency);
+    }
+}
+
+void TunerModel::runTowards(const QString& frequency, Step step)
+{
+    const QString next = nextFrequency(step);
+    if (next == frequency) {
+        tuneTo(frequency);
+        return;
+    }
+    set("frequency", next);
+    set("stationName", QString());
+    set("radioText", QString());
+}
+
+int TunerModel::stepsBetween(const QString& from, const QString& to, Step step) const
+{
+    if (m_band.step <= 0)
+        return 0;
+    const int count = int(std::lround((m_band.maximum - m_band.minimum) / m_band.step)) + 1;
+    const int distance = int(std::lround((to.toDouble() - from.toDouble()) / m_band.step)) * int(step);
+    return (distance % count + count) % count;
 }
 
 void TunerModel::stopSeek()
@@ -143,7 +172,7 @@ void TunerModel::stopSeek()
 
 void TunerModel::seek(Step step)
 {
-    beginSeek(nextStation(step), "seeking");
+    beginSeek(nextStation(step), step, "seeking");
 }
 
 void TunerModel::startWinding(Step step)
@@ -159,12 +188,17 @@ void TunerModel::stopWinding()
 
 void TunerModel::tuneStep(Step step)
 {
+    tuneTo(nextFrequency(step));
+}
+
+QString TunerModel::nextFrequency(Step step) const
+{
     if (m_band.step <= 0)
-        return tuneTo(text(m_band.stations[size_t(nextStation(step))].frequency));
+        return text(m_band.stations[size_t(nextStation(step))].frequency);
     const int steps = int(std::lround((m_band.maximum - m_band.minimum) / m_band.step)) + 1;
     const int current = int(std::lround((value("frequency").toString().toDouble() - m_band.minimum) / m_band.step));
     const int next = (current + int(step) + steps) % steps;
-    tuneTo(QString::number(m_band.minimum + next * m_band.step, 'f', m_band.decimals));
+    return QString::number(m_band.minimum + next * m_band.step, 'f', m_band.decimals);
 }
 
 void TunerModel::activate(int instance)
@@ -235,24 +269,44 @@ void TunerModel::setTrafficAnnouncements(bool enabled)
         if (!m_band.stations[size_t(row)].traffic)
             continue;
         if (row != current)
-            beginSeek(row, "tpSeekInProgress");
+            beginSeek(row, Step::Up, "tpSeekInProgress");
         return;
     }
 }
 
-void TunerModel::autoStore()
+void TunerModel::startAutoStore()
 {
-    m_autoStore = 0;
+    cancelAutoStore();
+    stopSeek();
+    set("autoStoreInProgress", true);
+    m_autoStoreProgress = scheduler().every(
+        autoStoreTime / 20, [this] { set("autoStoreProgress", qMin(95, value("autoStoreProgress").toInt() + 5)); });
+    m_autoStore = scheduler().answerAfter(autoStoreTime, [this] { storeStrongest(); });
+}
+
+/// Only a whole run changes presets.
+void TunerModel::cancelAutoStore()
+{
+    scheduler().cancel(&m_autoStore);
+    scheduler().cancel(&m_autoStoreProgress);
+    set("autoStoreInProgress", false);
+    set("autoStoreProgress", 0);
+}
+
+void TunerModel::storeStrongest()
+{
     std::vector<int> rows(m_band.stations.size());
     std::iota(rows.begin(), rows.end(), 0);
     std::stable_sort(rows.begin(), rows.end(), [this](int left, int right) {
         return m_band.stations[size_t(left)].signal > m_band.stations[size_t(right)].signal;
     });
     const int first = value("activePresetBank").toInt() * bankSize;
-    for (int i = 0; i < bankSize; ++i)
-        m_presets[size_t(first + i)] = i < int(rows.size()) ? rows[size_t(i)] : -1;
+    for (int i = 0; i < bankSize; ++i) {
+        const size_t place = size_t(first) + size_t(i);
+        m_presets[place] = i < int(rows.size()) ? rows[size_t(i)] : -1;
+    }
     publishPresets();
-    set("autoStoreInProgress", false);
+    cancelAutoStore();
     recall(first + 1);
 }
 
@@ -264,6 +318,28 @@ void TunerModel::startAnnouncement(const QString& announcement)
     set("announcementText", announcement);
     scheduler().cancel(&m_announcement);
     m_announcement = scheduler().every(announcementTime, [this] { endAnnouncement(); });
+}
+
+bool TunerModel::announces() const
+{
+    return value("announcementType").toInt() != 0;
+}
+
+bool TunerModel::assign(const QString& field, const QJsonValue& wanted)
+{
+    if (field == QLatin1String("frequency"))
+        return tuneTo(wanted.toString());
+    if (field == QLatin1String("activePresetBank")) {
+        selectBank(wanted.toInt());
+        return value("activePresetBank") == wanted;
+    }
+    if (field == QLatin1String("trafficAnnouncementEnabled"))
+        setTrafficAnnouncements(wanted.toBool());
+    else if (field == QLatin1String("autoStoreInProgress"))
+        wanted.toBool() ? startAutoStore() : cancelAutoStore();
+    else
+        return AudioModel::assign(field, wanted);
+    return true;
 }
 
 void TunerModel::endAnnouncement()

@@ -14,6 +14,7 @@
 #include <sys/stat.h>
 #include <sys/un.h>
 #include <unistd.h>
+#include <utility>
 
 namespace HmiVehicle {
 
@@ -21,9 +22,10 @@ Q_DECLARE_LOGGING_CATEGORY(vehicleLog)
 
 struct VehicleDirectory::Listener
 {
-    Listener(int listeningSocket, Channel servedChannel)
+    Listener(int listeningSocket, const QString& socketName, std::function<void(int)> whenConnected)
         : socket(listeningSocket)
-        , channel(servedChannel)
+        , name(socketName)
+        , connected(std::move(whenConnected))
         , notifier(listeningSocket, QSocketNotifier::Read)
     {
     }
@@ -35,7 +37,8 @@ struct VehicleDirectory::Listener
     Q_DISABLE_COPY(Listener)
 
     const int socket;
-    const Channel channel;
+    const QString name;
+    const std::function<void(int)> connected;
     QSocketNotifier notifier;
 };
 
@@ -47,7 +50,7 @@ VehicleDirectory::VehicleDirectory(QObject* parent)
 VehicleDirectory::~VehicleDirectory()
 {
     for (const auto& listener : m_listeners)
-        ::unlinkat(m_directory, channelName(listener->channel).toLatin1().constData(), 0);
+        ::unlinkat(m_directory, listener->name.toLatin1().constData(), 0);
     m_listeners.clear();
     if (m_directory >= 0)
         ::close(m_directory);
@@ -95,15 +98,15 @@ bool VehicleDirectory::listen(const QString& path)
     if (!openDirectory(path))
         return false;
     for (const Channel channel : allChannels)
-        if (!listenOn(channel))
+        if (!listenOn(channelName(channel), [this, channel](int socket) { Q_EMIT connected(channel, socket); }))
             return false;
-    return true;
+    return listenOn(QStringLiteral("control"), [this](int socket) { Q_EMIT controlConnected(socket); });
 }
 
 /// Through the opened directory, so that a long path does no harm.
-bool VehicleDirectory::listenOn(Channel channel)
+bool VehicleDirectory::listenOn(const QString& socketName, std::function<void(int)> whenConnected)
 {
-    const QByteArray name = channelName(channel).toLatin1();
+    const QByteArray name = socketName.toLatin1();
     ::unlinkat(m_directory, name.constData(), 0); // whoever had it is dead: we hold the lock
     sockaddr_un address{};
     address.sun_family = AF_UNIX;
@@ -114,9 +117,9 @@ bool VehicleDirectory::listenOn(Channel channel)
         const QString problem = QString::fromLocal8Bit(std::strerror(errno));
         if (socket >= 0)
             ::close(socket);
-        return fail(channelName(channel) + QStringLiteral(": ") + problem);
+        return fail(socketName + QStringLiteral(": ") + problem);
     }
-    m_listeners.push_back(std::make_unique<Listener>(socket, channel));
+    m_listeners.push_back(std::make_unique<Listener>(socket, socketName, std::move(whenConnected)));
     const Listener* const listener = m_listeners.back().get();
     connect(&listener->notifier, &QSocketNotifier::activated, this, [this, listener] { accept(*listener); });
     return true;
@@ -130,12 +133,11 @@ void VehicleDirectory::accept(const Listener& listener)
     ucred peer{};
     socklen_t size = sizeof peer;
     if (::getsockopt(socket, SOL_SOCKET, SO_PEERCRED, &peer, &size) == 0 && peer.uid == ::geteuid()) {
-        Q_EMIT connected(listener.channel, socket);
+        listener.connected(socket);
         return;
     }
     ::close(socket);
-    qCWarning(vehicleLog).noquote() << "HMI on" << channelName(listener.channel)
-                                    << "refused: it is run by another user";
+    qCWarning(vehicleLog).noquote() << "Refused on" << listener.name + QLatin1Char(':') << "it is run by another user";
 }
 
 } // namespace HmiVehicle

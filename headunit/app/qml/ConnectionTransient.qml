@@ -17,6 +17,7 @@ Rectangle {
         anchors.centerIn: parent
         spacing: Theme.gap
         layoutDirection: Theme.mirrored ? Qt.RightToLeft : Qt.LeftToRight
+        LayoutMirroring.enabled: false // mirrored by its layout direction
 
         Icon {
             anchors.verticalCenter: parent.verticalCenter

@@ -1,20 +1,41 @@
 // SPDX-License-Identifier: MIT
 import QtQuick 2.15
+import HmiIntents 1.0
 import HmiUi 1.0
 
 /// What is heard now, with the keys that every source has.
 Card {
     id: root
 
+    readonly property HmiIntentMonitor suspend: HmiIntents.intentMonitor(HmiIntents.SuspendMediaPlayback)
+    readonly property HmiIntentMonitor resume: HmiIntents.intentMonitor(HmiIntents.ResumeMediaPlayback)
+
     Column {
         anchors { left: parent.left; right: parent.right; top: parent.top; margins: Theme.margin }
         spacing: Theme.gap / 2
 
-        Label {
+        Item {
             width: parent.width
-            content: _nowPlaying.source
-            color: Theme.accent
-            font.weight: Font.DemiBold
+            height: Theme.touchTarget
+
+            Label {
+                anchors { left: parent.left; right: sources.left; verticalCenter: parent.verticalCenter }
+                objectName: "nowPlayingSource"
+                content: _nowPlaying.source
+                color: Theme.accent
+                font.weight: Font.DemiBold
+            }
+
+            IconButton {
+                id: sources
+
+                objectName: "launcherSources"
+                anchors { right: parent.right; verticalCenter: parent.verticalCenter }
+                icon: "source"
+                label: qsTr("Sources")
+                fill: Theme.surfaceHigh
+                onClicked: _viewManager.requestPopup("SYSTEM.AudioSources")
+            }
         }
 
         Label {
@@ -38,8 +59,8 @@ Card {
 
     Rectangle {
         anchors.centerIn: parent
-        anchors.verticalCenterOffset: Theme.px(24)
-        width: Theme.px(196)
+        anchors.verticalCenterOffset: Theme.px(44)
+        width: Theme.px(180)
         height: width
         radius: width / 2
         color: Theme.accentSoft
@@ -47,7 +68,7 @@ Card {
         Icon {
             anchors.centerIn: parent
             name: _nowPlaying.icon
-            size: Theme.px(96)
+            size: Theme.px(88)
             color: Theme.accent
         }
     }
@@ -56,6 +77,7 @@ Card {
         anchors { horizontalCenter: parent.horizontalCenter; bottom: parent.bottom; bottomMargin: Theme.margin }
         spacing: Theme.margin
         layoutDirection: Theme.mirrored ? Qt.RightToLeft : Qt.LeftToRight
+        LayoutMirroring.enabled: false // mirrored by its layout direction
 
         IconButton {
             width: Theme.px(88)
@@ -70,6 +92,20 @@ Card {
         IconButton {
             width: Theme.px(88)
             height: width
+            objectName: "nowPlayingPause"
+            visible: _nowPlaying.pausable
+            icon: _nowPlaying.playing ? "pause" : "play"
+            label: _nowPlaying.playing ? qsTr("Pause") : qsTr("Play")
+            fill: Theme.surfaceHigh
+            active: _nowPlaying.playing ? root.suspend && root.suspend.enabled : root.resume && root.resume.enabled
+            onClicked: HmiIntents.requestAction(_nowPlaying.playing ? HmiIntents.SuspendMediaPlayback : HmiIntents.ResumeMediaPlayback)
+        }
+
+        IconButton {
+            width: Theme.px(88)
+            height: width
+            objectName: "nowPlayingMute"
+            visible: !_nowPlaying.pausable
             icon: _globalSource.muted ? "volume" : "mute"
             label: _globalSource.muted ? qsTr("Sound on") : qsTr("Mute")
             fill: Theme.surfaceHigh

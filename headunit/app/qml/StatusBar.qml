@@ -21,7 +21,16 @@ Item {
         anchors { right: parent.right; rightMargin: Theme.margin; verticalCenter: parent.verticalCenter }
         spacing: Theme.gap * 1.25
 
+        IconButton {
+            objectName: "openSearch"
+            anchors.verticalCenter: parent.verticalCenter
+            icon: "search"
+            label: qsTr("Search")
+            onClicked: _viewManager.requestView("SYSTEM.Search")
+        }
+
         Icon {
+            objectName: "statusDisconnected"
             anchors.verticalCenter: parent.verticalCenter
             visible: !_bridgeConnection.connected
             name: "disconnected"
@@ -29,7 +38,25 @@ Item {
             color: Theme.negative
         }
 
+        TurnChip {
+            anchors.verticalCenter: parent.verticalCenter
+        }
+
+        CallChip {
+            anchors.verticalCenter: parent.verticalCenter
+        }
+
         Icon {
+            objectName: "statusEmergency"
+            anchors.verticalCenter: parent.verticalCenter
+            visible: _eaPhoneSource.eventsBlocked
+            name: "emergency"
+            size: Theme.px(28)
+            color: Theme.negative
+        }
+
+        Icon {
+            objectName: "statusMuted"
             anchors.verticalCenter: parent.verticalCenter
             visible: _globalSource.muted
             name: "mute"
@@ -57,14 +84,14 @@ Item {
         Label {
             anchors.verticalCenter: parent.verticalCenter
             visible: _bridgeConnection.connected
-            content: qsTr("%1 °C").arg(Math.round(_globalSource.outsideTemperature))
+            content: _market.temperature(_globalSource.outsideTemperature)
             color: Theme.textMuted
         }
 
         Label {
             objectName: "statusClock"
             anchors.verticalCenter: parent.verticalCenter
-            content: _globalSource.clockText
+            content: _market.clock(_globalSource.clockText)
             font.weight: Font.DemiBold
         }
     }

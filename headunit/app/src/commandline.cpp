@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "commandline.h"
 
+#include "keyboard.h"
+
+#include <HmiVehicle/languages.h>
+
 #include <QCommandLineParser>
 #include <QCoreApplication>
 #include <QFile>
@@ -39,7 +43,8 @@ QString helpText(const QCommandLineParser& parser, const QStringList& arguments)
     int argc = 1;
     if (!QCoreApplication::instance())
         application = std::make_unique<QCoreApplication>(argc, argv);
-    return parser.helpText();
+    return parser.helpText() + QStringLiteral("\nKeys of the keyboard that are hard keys of the vehicle:\n")
+           + Keyboard::help();
 }
 
 } // namespace
@@ -63,11 +68,25 @@ CommandLine CommandLine::parse(const QStringList& arguments)
     const QCommandLineOption record(QStringLiteral("record"),
                                     QStringLiteral("Write all traffic with the vehicle to <file>."),
                                     QStringLiteral("file"));
+    const QCommandLineOption tour(QStringLiteral("tour"),
+                                  QStringLiteral("Lead through the head unit by the steps of <file>, and exit with 0 "
+                                                 "when the screens show what they should."),
+                                  QStringLiteral("file"));
+    const QCommandLineOption pictures(
+        QStringLiteral("pictures"), QStringLiteral("Draw the tour without a display, and write its pictures to <dir>."),
+        QStringLiteral("dir"));
+    const QCommandLineOption country(
+        QStringLiteral("country"),
+        QStringLiteral("Country of the built-in vehicle, as markets/config.json writes it, such as 114 for Germany."),
+        QStringLiteral("code"));
+    const QCommandLineOption language(QStringLiteral("language"),
+                                      QStringLiteral("Language of the built-in vehicle, such as de_DE."),
+                                      QStringLiteral("locale"));
     const QCommandLineOption help({QStringLiteral("h"), QStringLiteral("help")}, QStringLiteral("Print this text."));
 
     QCommandLineParser parser;
     parser.setApplicationDescription(QStringLiteral("The reference head unit."));
-    parser.addOptions({vehicle, shot, view, size, night, listViews, record, help});
+    parser.addOptions({vehicle, shot, view, size, night, listViews, tour, pictures, record, country, language, help});
     if (!parser.parse(arguments))
         return wrong(parser.errorText());
     if (!parser.positionalArguments().isEmpty())
@@ -89,6 +108,25 @@ CommandLine CommandLine::parse(const QStringList& arguments)
     }
     if (parser.isSet(shot) && parser.value(shot).isEmpty())
         return wrong(QStringLiteral("--shot needs the name of a file."));
+    line.tourFile = parser.value(tour);
+    line.pictures = parser.value(pictures);
+    if (!line.tourFile.isEmpty() && parser.isSet(vehicle))
+        return wrong(QStringLiteral("--tour drives the built-in vehicle, and so cannot be used with --vehicle."));
+    if (line.tourFile.isEmpty() && parser.isSet(pictures))
+        return wrong(QStringLiteral("--pictures is for --tour."));
+    bool isCountry = true;
+    if (parser.isSet(country))
+        line.country = parser.value(country).toInt(&isCountry, 16);
+    if (!isCountry || line.country < -1)
+        return wrong(QStringLiteral("'%1' is not the hexadecimal code of a country.").arg(parser.value(country)));
+    if (parser.isSet(language)) {
+        line.language = HmiVehicle::languageFromLocale(parser.value(language));
+        if (line.language < 0)
+            return wrong(
+                QStringLiteral("'%1' is not the locale of a language, such as de_DE.").arg(parser.value(language)));
+    }
+    if (parser.isSet(vehicle) && (parser.isSet(country) || parser.isSet(language)))
+        return wrong(QStringLiteral("--country and --language are for the built-in vehicle; another one has its own."));
     line.vehicleDirectory = parser.value(vehicle);
     line.shotFile = parser.value(shot);
     line.view = parser.value(view);

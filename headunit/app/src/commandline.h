@@ -19,8 +19,12 @@ struct CommandLine
     QString vehicleDirectory; ///< empty for the vehicle that is built in
     QString shotFile;         ///< empty to run
     QString view;             ///< view or popup to show, empty for the start screen
+    QString tourFile;         ///< empty for no tour
+    QString pictures;         ///< folder for the pictures of the tour, empty for none
     QString recordFile;       ///< empty for no recording
     QSize size{1280, 720};
+    int country = -1;  ///< that the built-in vehicle is made for, -1 for its own
+    int language = -1; ///< that it is set to, -1 for its own
     bool night = false;
     bool listViews = false;
 };

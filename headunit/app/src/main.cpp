@@ -1,8 +1,11 @@
 // SPDX-License-Identifier: MIT
 #include "commandline.h"
+#include "keyboard.h"
 #include "productinitializer.h"
 #include "screenshot.h"
 #include "settings.h"
+#include "tour.h"
+#include "vehiclekeys.h"
 
 #include <AL2HMIBridge/BridgeEndpoint>
 #include <AL2HMIBridge/BridgeRecorder>
@@ -11,7 +14,9 @@
 #include <HmiGuiFramework/AppSettings>
 #include <HmiGuiFramework/DataStore>
 #include <HmiGuiFramework/ViewManager>
+#include <HmiGuiFramework/WindowManager>
 #include <HmiLogging/MessageHandler>
+#include <HmiStateMachine/StateMachine>
 #include <HmiVehicle/embeddedvehicle.h>
 
 #include <QTextStream>
@@ -23,12 +28,14 @@ using HmiCore::HmiManager;
 using HmiGuiFramework::AppSettings;
 using HmiGuiFramework::DataStore;
 using HmiGuiFramework::ViewManager;
+using HmiStateMachine::StateMachine;
 using HmiVehicle::EmbeddedVehicle;
 
 namespace {
 
 constexpr int cannotRun = 1;
 constexpr int wrongUsage = 2;
+constexpr int paceOfTour = 1200; // ms
 
 /// Pictures are drawn without a display and without the pace of one.
 void drawOffScreen()
@@ -41,10 +48,14 @@ EmbeddedVehicle* vehicle = nullptr;
 
 /// The bridge connects as soon as the application object exists, and the vehicle's thread needs that object: so the vehicle
 /// starts while the object is made, and stops while it is destroyed.
-void useEmbeddedVehicle(bool frozen)
+void useEmbeddedVehicle(const CommandLine& commandLine, bool frozen)
 {
     HmiVehicle::Vehicle::Options options;
     options.frozen = frozen;
+    if (commandLine.country >= 0)
+        options.destinationCountry = commandLine.country;
+    if (commandLine.language >= 0)
+        options.systemLanguage = commandLine.language;
     static EmbeddedVehicle embedded(options);
     vehicle = &embedded;
     qAddPreRoutine([] { vehicle->start(); });
@@ -62,12 +73,51 @@ int listViews()
     return 0;
 }
 
+/// The keyboard of the PC presses the vehicle's hard keys. The window owns what does that.
+void connectKeyboard(const CommandLine& commandLine)
+{
+    auto* const windows = DataStore::get<HmiGuiFramework::WindowManager>(QStringLiteral("WindowManager"));
+    new Keyboard(windows->hmiWindow(), vehicle ? keysOf(vehicle) : keysOf(commandLine.vehicleDirectory));
+}
+
+void showFirst(const QString& view)
+{
+    QObject::connect(StateMachine::instance(), &QStateMachine::started, StateMachine::instance(), [view] {
+        auto* const views = DataStore::get<ViewManager>(QStringLiteral("ViewManager"));
+        if (views->guiDescriptor().popups.contains(view))
+            views->requestPopup(view);
+        else
+            views->requestView(view);
+    });
+}
+
+/// With a display the tour is for somebody who looks on.
+void lead(HmiApplication& application, const CommandLine& commandLine, const TourFile& file)
+{
+    Tour::Options options;
+    options.pictures = commandLine.pictures;
+    options.pace = QGuiApplication::platformName() == QLatin1String("offscreen") ? 0 : paceOfTour;
+    auto* const tour = new Tour(file, *vehicle, options, &application);
+    QObject::connect(tour, &Tour::captionChanged, tour, [tour] { QTextStream(stdout) << tour->caption() << Qt::endl; });
+    QObject::connect(tour, &Tour::finished, tour, [](const QString& failure) {
+        if (!failure.isEmpty())
+            QTextStream(stderr) << "headunit: " << failure << '\n';
+        QCoreApplication::exit(failure.isEmpty() ? 0 : cannotRun);
+    });
+    tour->start();
+}
+
 int run(HmiApplication& application, const CommandLine& commandLine)
 {
     ProductInitializer initializer(commandLine.night);
     application.initialize(&initializer);
     if (commandLine.listViews)
         return listViews();
+    TourFile tour;
+    if (!commandLine.tourFile.isEmpty() && !tour.load(commandLine.tourFile)) {
+        QTextStream(stderr) << "headunit: " << tour.errorString() << '\n';
+        return wrongUsage;
+    }
     QString unknown;
     if (!commandLine.view.isEmpty() && !Screenshot::isKnown(commandLine.view, &unknown)) {
         QTextStream(stderr) << "headunit: " << unknown << '\n';
@@ -76,9 +126,15 @@ int run(HmiApplication& application, const CommandLine& commandLine)
     application.startHmi();
     Q_EMIT HmiManager::instance()->showHmiUI();
 
-    if (!commandLine.shotFile.isEmpty()) {
+    if (!commandLine.tourFile.isEmpty()) {
+        lead(application, commandLine, tour);
+    } else if (!commandLine.shotFile.isEmpty()) {
         auto* const screenshot = new Screenshot(commandLine.shotFile, commandLine.view, &application);
         screenshot->start();
+    } else {
+        connectKeyboard(commandLine);
+        if (!commandLine.view.isEmpty())
+            showFirst(commandLine.view);
     }
     return application.exec();
 }
@@ -97,12 +153,12 @@ int main(int argc, char** argv)
     }
 
     const HmiLogging::MessageHandler messageHandler(QStringLiteral("HMI"));
-    const bool headless = !commandLine.shotFile.isEmpty() || commandLine.listViews;
+    const bool headless = !commandLine.shotFile.isEmpty() || !commandLine.pictures.isEmpty() || commandLine.listViews;
     if (headless)
         drawOffScreen();
 
     if (commandLine.vehicleDirectory.isEmpty())
-        useEmbeddedVehicle(headless);
+        useEmbeddedVehicle(commandLine, headless || !commandLine.tourFile.isEmpty());
     else
         BridgeEndpoint::setDirectory(commandLine.vehicleDirectory);
 

@@ -7,47 +7,127 @@
 #include <AL2HMIBridge/FMTunerSource>
 #include <AL2HMIBridge/GlobalSource>
 #include <AL2HMIBridge/MediaAudioSource>
+#include <AL2HMIBridge/ProjectionSource>
 #include <AL2HMIBridge/XMTunerSource>
+#include <HmiCore/HmiManager>
 
 using namespace AL2HMIBridge;
+using HmiCore::HmiManager;
 
 namespace {
 
-/// The tuner that is the main audio source, or null.
-TunerSource* mainTuner()
+struct Kind
 {
-    switch (GlobalSource::instance()->mainAudioSource()) {
-    case GlobalSource::AudioAM:
-        return AMTunerSource::instance();
-    case GlobalSource::AudioFM:
-        return FMTunerSource::instance();
-    case GlobalSource::AudioXM:
-        return XMTunerSource::instance();
-    case GlobalSource::AudioDAB:
-        return DABTunerSource::instance();
-    default:
-        return nullptr;
-    }
+    GlobalSource::ALAudioSource source;
+    const char* name;
+    const char* icon;
+    QString (*title)();
+    QString (*subtitle)();
+    void (*next)();
+    void (*previous)();
+    bool (*isPlaying)(); // null for what cannot pause
+};
+
+QString frequency(const TunerSource* tuner)
+{
+    return tuner->frequency() + QLatin1Char(' ') + tuner->frequencyUnit();
 }
 
-QString sourceName()
+template <typename Tuner>
+QString station()
 {
-    switch (GlobalSource::instance()->mainAudioSource()) {
-    case GlobalSource::AudioAM:
-        return QStringLiteral("AM");
-    case GlobalSource::AudioFM:
-        return QStringLiteral("FM");
-    case GlobalSource::AudioXM:
-        return NowPlaying::tr("Satellite");
-    case GlobalSource::AudioDAB:
-        return QStringLiteral("DAB");
-    case GlobalSource::AudioCD:
-        return NowPlaying::tr("CD");
-    case GlobalSource::AudioMedia:
-        return NowPlaying::tr("Media");
-    default:
-        return QString();
-    }
+    const TunerSource* const tuner = Tuner::instance();
+    return tuner->stationName().isEmpty() ? frequency(tuner) : tuner->stationName();
+}
+
+template <typename Tuner>
+QString radioText()
+{
+    const TunerSource* const tuner = Tuner::instance();
+    return tuner->radioText().isEmpty() ? frequency(tuner) : tuner->radioText();
+}
+
+QString song()
+{
+    const auto* const tuner = XMTunerSource::instance();
+    if (tuner->artist().isEmpty() || tuner->title().isEmpty())
+        return tuner->title() + tuner->artist();
+    return tuner->artist() + QStringLiteral(" – ") + tuner->title();
+}
+
+QString phoneTitle()
+{
+    const auto* const phone = ProjectionSource::instance();
+    return phone->projectedTitle().isEmpty() ? phone->projectedDeviceName() : phone->projectedTitle();
+}
+
+QString phoneArtist()
+{
+    const auto* const phone = ProjectionSource::instance();
+    return phone->projectedArtist().isEmpty() ? NowPlaying::tr("Plays on the phone") : phone->projectedArtist();
+}
+
+void seekUp()
+{
+    GlobalSource::instance()->sendShortSeekUp();
+}
+
+void seekDown()
+{
+    GlobalSource::instance()->sendShortSeekDown();
+}
+
+/// A projected phone is operated with the numbers of the hard keys.
+template <int key>
+void pressPhoneKey()
+{
+    ProjectionSource::instance()->projectionButtonPress(key);
+    ProjectionSource::instance()->projectionButtonRelease(key);
+}
+
+constexpr Kind projection(GlobalSource::ALAudioSource source)
+{
+    return {source,           QT_TRANSLATE_NOOP("NowPlaying", "Phone"),
+            "projection",     phoneTitle,
+            phoneArtist,      pressPhoneKey<7>,
+            pressPhoneKey<6>, [] { return ProjectionSource::instance()->projectedPlaying(); }};
+}
+
+template <typename Tuner>
+constexpr Kind radio(GlobalSource::ALAudioSource source, const char* name)
+{
+    return {source, name, "radio", station<Tuner>, radioText<Tuner>, seekUp, seekDown, nullptr};
+}
+
+const Kind kinds[] = {
+    radio<AMTunerSource>(GlobalSource::AudioAM, QT_TRANSLATE_NOOP("NowPlaying", "AM")),
+    radio<FMTunerSource>(GlobalSource::AudioFM, QT_TRANSLATE_NOOP("NowPlaying", "FM")),
+    radio<DABTunerSource>(GlobalSource::AudioDAB, QT_TRANSLATE_NOOP("NowPlaying", "DAB")),
+    {GlobalSource::AudioXM, QT_TRANSLATE_NOOP("NowPlaying", "Satellite"), "satellite", station<XMTunerSource>, song,
+     seekUp, seekDown, nullptr},
+    {GlobalSource::AudioCD, QT_TRANSLATE_NOOP("NowPlaying", "CD"), "disc",
+     [] {
+         return CDSource::instance()->title().isEmpty() ? NowPlaying::tr("Track %1").arg(CDSource::instance()->track())
+                                                        : CDSource::instance()->title();
+     },
+     [] { return CDSource::instance()->discTitle(); }, [] { CDSource::instance()->nextTrack(); },
+     [] { CDSource::instance()->previousTrack(); },
+     [] { return CDSource::instance()->cdStatus() == CDSource::CDPlaying; }},
+    {GlobalSource::AudioMedia, QT_TRANSLATE_NOOP("NowPlaying", "Player"), "media",
+     [] { return MediaAudioSource::instance()->title(); }, [] { return MediaAudioSource::instance()->artist(); },
+     [] { MediaAudioSource::instance()->next(); }, [] { MediaAudioSource::instance()->previous(); },
+     [] { return MediaAudioSource::instance()->playing(); }},
+    projection(GlobalSource::AudioProjectionWired),
+    projection(GlobalSource::AudioProjectionWireless),
+};
+
+/// What is the main audio source, or null.
+const Kind* heard()
+{
+    for (const Kind& kind : kinds)
+        if (kind.source == GlobalSource::instance()->mainAudioSource())
+            return &kind;
+    return nullptr;
 }
 
 } // namespace
@@ -55,59 +135,70 @@ QString sourceName()
 NowPlaying::NowPlaying(QObject* parent)
     : QObject(parent)
 {
-    connect(GlobalSource::instance(), &GlobalSource::mainAudioSourceChanged, this, &NowPlaying::update);
+    connect(GlobalSource::instance(), &GlobalSource::mainAudioSourceChanged, this, &NowPlaying::changed);
     for (TunerSource* const tuner :
          {static_cast<TunerSource*>(AMTunerSource::instance()), static_cast<TunerSource*>(FMTunerSource::instance()),
           static_cast<TunerSource*>(XMTunerSource::instance()),
           static_cast<TunerSource*>(DABTunerSource::instance())}) {
-        connect(tuner, &TunerSource::frequencyChanged, this, &NowPlaying::update);
-        connect(tuner, &TunerSource::stationNameChanged, this, &NowPlaying::update);
-        connect(tuner, &TunerSource::radioTextChanged, this, &NowPlaying::update);
+        connect(tuner, &TunerSource::frequencyChanged, this, &NowPlaying::changed);
+        connect(tuner, &TunerSource::stationNameChanged, this, &NowPlaying::changed);
+        connect(tuner, &TunerSource::radioTextChanged, this, &NowPlaying::changed);
     }
-    connect(MediaAudioSource::instance(), &MediaAudioSource::titleChanged, this, &NowPlaying::update);
-    connect(MediaAudioSource::instance(), &MediaAudioSource::artistChanged, this, &NowPlaying::update);
-    connect(CDSource::instance(), &CDSource::titleChanged, this, &NowPlaying::update);
-    update();
+    connect(XMTunerSource::instance(), &XMTunerSource::titleChanged, this, &NowPlaying::changed);
+    connect(XMTunerSource::instance(), &XMTunerSource::artistChanged, this, &NowPlaying::changed);
+    connect(MediaAudioSource::instance(), &MediaAudioSource::titleChanged, this, &NowPlaying::changed);
+    connect(MediaAudioSource::instance(), &MediaAudioSource::artistChanged, this, &NowPlaying::changed);
+    connect(MediaAudioSource::instance(), &MediaAudioSource::playingChanged, this, &NowPlaying::changed);
+    connect(CDSource::instance(), &CDSource::titleChanged, this, &NowPlaying::changed);
+    connect(CDSource::instance(), &CDSource::trackChanged, this, &NowPlaying::changed);
+    connect(CDSource::instance(), &CDSource::discTitleChanged, this, &NowPlaying::changed);
+    connect(CDSource::instance(), &CDSource::cdStatusChanged, this, &NowPlaying::changed);
+    auto* const phone = ProjectionSource::instance();
+    connect(phone, &ProjectionSource::projectedDeviceNameChanged, this, &NowPlaying::changed);
+    connect(phone, &ProjectionSource::projectedPlayingChanged, this, &NowPlaying::changed);
+    connect(phone, &ProjectionSource::projectedTitleChanged, this, &NowPlaying::changed);
+    connect(phone, &ProjectionSource::projectedArtistChanged, this, &NowPlaying::changed);
+    connect(HmiManager::instance(), &HmiManager::hmiRetranslated, this, &NowPlaying::changed);
+}
+
+QString NowPlaying::source() const
+{
+    return heard() ? tr(heard()->name) : QString();
 }
 
 QString NowPlaying::icon() const
 {
-    return mainTuner() ? QStringLiteral("radio") : QStringLiteral("media");
+    return heard() ? QString::fromLatin1(heard()->icon) : QStringLiteral("media");
+}
+
+QString NowPlaying::title() const
+{
+    return heard() ? heard()->title() : QString();
+}
+
+QString NowPlaying::subtitle() const
+{
+    return heard() ? heard()->subtitle() : QString();
+}
+
+bool NowPlaying::pausable() const
+{
+    return heard() && heard()->isPlaying;
+}
+
+bool NowPlaying::playing() const
+{
+    return !pausable() || heard()->isPlaying();
 }
 
 void NowPlaying::next()
 {
-    if (mainTuner())
-        GlobalSource::instance()->sendShortSeekUp();
-    else if (GlobalSource::instance()->mainAudioSource() == GlobalSource::AudioCD)
-        CDSource::instance()->nextTrack();
-    else
-        MediaAudioSource::instance()->next();
+    if (heard())
+        heard()->next();
 }
 
 void NowPlaying::previous()
 {
-    if (mainTuner())
-        GlobalSource::instance()->sendShortSeekDown();
-    else if (GlobalSource::instance()->mainAudioSource() == GlobalSource::AudioCD)
-        CDSource::instance()->previousTrack();
-    else
-        MediaAudioSource::instance()->previous();
-}
-
-void NowPlaying::update()
-{
-    m_source = sourceName();
-    if (const TunerSource* const tuner = mainTuner()) {
-        const QString frequency = tuner->frequency() + QLatin1Char(' ') + tuner->frequencyUnit();
-        m_title = tuner->stationName().isEmpty() ? frequency : tuner->stationName();
-        m_subtitle = tuner->radioText().isEmpty() ? frequency : tuner->radioText();
-    } else if (GlobalSource::instance()->mainAudioSource() == GlobalSource::AudioCD) {
-        m_title = CDSource::instance()->title();
-        m_subtitle = CDSource::instance()->discTitle();
-    } else {
-        m_title = MediaAudioSource::instance()->title();
-        m_subtitle = MediaAudioSource::instance()->artist();
-    }
-    Q_EMIT changed();
+    if (heard())
+        heard()->previous();
 }

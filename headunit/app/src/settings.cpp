@@ -21,6 +21,6 @@ void applySettings(const QSize& windowSize)
     QCoreApplication::setApplicationVersion(QStringLiteral(HEADUNIT_VERSION));
     QFont font;
     font.setFamilies(
-        {QStringLiteral("Inter"), QStringLiteral("Noto Sans Arabic"), QStringLiteral("WenQuanYi Micro Hei")});
+        {QStringLiteral("Inter"), QStringLiteral("Noto Sans Arabic UI"), QStringLiteral("WenQuanYi Micro Hei")});
     QGuiApplication::setFont(font);
 }

@@ -5,6 +5,14 @@
 
 using namespace HmiStateMachine;
 
+namespace {
+
+/// Popups that belong to no module.
+const char* const systemPopups[] = {"SYSTEM.InputPanel", "SYSTEM.AudioSources", "SYSTEM.Standby",
+                                    "SYSTEM.DisplayOff", "SYSTEM.Valet",        "SYSTEM.Voice"};
+
+} // namespace
+
 TopStateTree::TopStateTree(StateMachine* machine)
 {
     auto* const root = new NamedState(QStringLiteral("Root"), QState::ParallelStates, machine);
@@ -12,8 +20,12 @@ TopStateTree::TopStateTree(StateMachine* machine)
     m_views = new HmiState(QStringLiteral("Views"), root);
     m_launcher = new HmiState(QStringLiteral("SYSTEM.Launcher"), m_views);
     m_views->setInitialState(m_launcher);
+    new HmiState(QStringLiteral("SYSTEM.Search"), m_views);
+    new HmiState(QStringLiteral("SYSTEM.Projection"), m_views);
     m_popups = addPopupRegion(root);
     m_systemPopups = addPopupRegion(root);
+    for (const char* const popup : systemPopups)
+        addPopupState(SystemLevel, new PopupState(QString::fromLatin1(popup)));
 }
 
 QState* TopStateTree::addPopupRegion(QState* root)

@@ -44,6 +44,12 @@ void emitSignal(QObject* receiver, void (Class::*signal)(), const std::vector<Va
 }
 
 template <class Class>
+void emitSignal(QObject* receiver, void (Class::*signal)(int), const std::vector<Value>& values)
+{
+    Q_EMIT(static_cast<Class*>(receiver)->*signal)(*std::get_if<int>(&values[0]));
+}
+
+template <class Class>
 void emitSignal(QObject* receiver, void (Class::*signal)(int, int), const std::vector<Value>& values)
 {
     Q_EMIT(static_cast<Class*>(receiver)->*signal)(*std::get_if<int>(&values[0]), *std::get_if<int>(&values[1]));

@@ -73,7 +73,6 @@ void PopupStack::remove(const QString& name)
     const int index = indexOf(name);
     if (index < 0)
         return;
-    const QPointer<PopupState> state = m_entries.at(index).state;
     const bool wasTop = index == m_entries.size() - 1;
     m_entries.remove(index);
     if (!wasTop)
@@ -84,8 +83,8 @@ void PopupStack::remove(const QString& name)
         m_entries.removeLast();
     }
     if (m_entries.isEmpty()) {
+        leaveRegion(m_shownState);
         hideShown();
-        leaveRegion(state);
         Q_EMIT topChanged();
     }
 }
@@ -141,8 +140,12 @@ bool PopupStack::showTop(QString* error)
         item->setProperty("popupData", entry.data);
     if (m_shown == entry.descriptor.identifier && m_item == item)
         return true;
+    // Within a region the machine leaves the one state for the other by itself.
+    if (m_shownState && m_shownState->parentState() != entry.state->parentState())
+        leaveRegion(m_shownState);
     hideShown();
     m_shown = entry.descriptor.identifier;
+    m_shownState = entry.state;
     m_item = item;
     item->setParentItem(m_area);
     if (m_area)
@@ -161,6 +164,7 @@ void PopupStack::hideShown()
         m_item->setVisible(false);
     m_item.clear();
     m_shown.clear();
+    m_shownState.clear();
 }
 
 } // namespace HmiGuiFramework

@@ -70,6 +70,7 @@ private:
     QVector<Entry> m_entries;  // last is topmost
     QSet<QObject*> m_expected; // states that were requested and are not entered yet; never followed
     QString m_shown;
+    QPointer<HmiStateMachine::PopupState> m_shownState;
     QPointer<QQuickItem> m_item;
     QTimer m_timeout;
 };

@@ -5,6 +5,7 @@
 #include <AL2HMIBridge/BezelDiagnosticsSource>
 #include <AL2HMIBridge/CDSource>
 #include <AL2HMIBridge/DABTunerSource>
+#include <AL2HMIBridge/DeveloperSource>
 #include <AL2HMIBridge/EAPhoneSource>
 #include <AL2HMIBridge/FMTunerSource>
 #include <AL2HMIBridge/GlobalSource>
@@ -71,6 +72,7 @@ QObject* TableSource::instance() const
         {QStringLiteral("DABTunerSource"), [] { return DABTunerSource::instance(); }},
         {QStringLiteral("CDSource"), [] { return CDSource::instance(); }},
         {QStringLiteral("MediaAudioSource"), [] { return MediaAudioSource::instance(); }},
+        {QStringLiteral("DeveloperSource"), [] { return DeveloperSource::instance(); }},
         {QStringLiteral("ValetModeSource"), [] { return ValetModeSource::instance(); }},
         {QStringLiteral("BezelDiagnosticsSource"), [] { return BezelDiagnosticsSource::instance(); }},
     };

@@ -72,7 +72,7 @@ private Q_SLOTS:
     void initTestCase()
     {
         m_table = readSourceTable();
-        QCOMPARE(m_table.size(), 14);
+        QCOMPARE(m_table.size(), 15);
     }
 
     void init()

@@ -18,7 +18,7 @@
 #include <memory>
 
 /// The framework's objects over a small state tree, as the core sets them up: views M.Home and the layered M.Module with
-/// M.Main, M.List and M.Edit; popups M.Call, M.Note, M.OtherNote and M.Short.
+/// M.Main, M.List and M.Edit; popups M.Call, M.Note and M.Short in one region, M.OtherNote in another.
 struct GuiFixture
 {
     using Machine = HmiStateMachine::StateMachine;
@@ -47,8 +47,11 @@ struct GuiFixture
         auto* const popups = new QState(root);
         noPopup = new QState(popups);
         popups->setInitialState(noPopup);
-        for (const char* const name : {"M.Call", "M.Note", "M.OtherNote", "M.Short", "M.BrokenPopup"})
+        for (const char* const name : {"M.Call", "M.Note", "M.Short", "M.BrokenPopup"})
             new PopupState(QString::fromLatin1(name), popups);
+        auto* const otherPopups = new QState(root);
+        otherPopups->setInitialState(new QState(otherPopups));
+        new PopupState(QStringLiteral("M.OtherNote"), otherPopups);
         transitions.setDuration(0);
         views.stage()->setSize(QSizeF(400, 300));
         HmiGuiFramework::DataStore::store(&views, QStringLiteral("ViewManager"));

@@ -47,6 +47,24 @@ private Q_SLOTS:
         QCOMPARE(gui.views.currentPopup(), QString());
     }
 
+    void onlyTheTopmostOnesStateIsActiveInAllRegions()
+    {
+        GuiFixture gui;
+        QVERIFY(gui.start());
+        gui.views.requestPopup(text("M.Note"));
+        QVERIFY(gui.becomesActive("M.Note"));
+        gui.views.requestPopup(text("M.OtherNote"));
+        QVERIFY(gui.becomesActive("M.OtherNote"));
+        QTRY_VERIFY(gui.noPopup->active());
+        QCOMPARE(gui.views.currentPopup(), text("M.OtherNote"));
+        gui.views.closePopup(text("M.OtherNote"));
+        QVERIFY(gui.becomesActive("M.Note"));
+        QTRY_VERIFY(!gui.isActive("M.OtherNote"));
+        QCOMPARE(gui.views.currentPopup(), text("M.Note"));
+        gui.views.closePopup(text("M.Note"));
+        QTRY_VERIFY(gui.noPopup->active());
+    }
+
     void theLastOneClosedLeavesNoPopupState()
     {
         GuiFixture gui;

@@ -39,6 +39,9 @@ public:
     /// \brief Lets \a action happen to the vehicle, in its thread, soon. Nothing happens when it does not run.
     void run(std::function<void(Vehicle& vehicle)> action);
 
+    /// \brief As run(), for who connects to the service's signals; it lives until stop().
+    void runInService(std::function<void(VehicleService& service)> action);
+
 private:
     struct Running;
 

@@ -6,12 +6,13 @@
 #include <QObject>
 #include <QSocketNotifier>
 
+#include <functional>
 #include <memory>
 #include <vector>
 
 namespace HmiVehicle {
 
-/// \brief Listens on the three sockets in a directory that only this user may enter. Needs the event loop of its thread.
+/// \brief Listens on the three sockets of the protocol and on `control` in a directory that only this user may enter. Needs the event loop of its thread.
 class VehicleDirectory : public QObject
 {
     Q_OBJECT
@@ -34,12 +35,14 @@ public:
 Q_SIGNALS:
     /// \brief An HMI of this user connected; the receiver owns the socket.
     void connected(HmiVehicle::Channel channel, int socket);
+    /// \brief A script, panel or keyboard of this user connected; the receiver owns the socket.
+    void controlConnected(int socket);
 
 private:
     struct Listener;
 
     bool openDirectory(const QString& path);
-    bool listenOn(Channel channel);
+    bool listenOn(const QString& name, std::function<void(int socket)> connected);
     void accept(const Listener& listener);
     bool fail(const QString& problem);
 

@@ -7,13 +7,14 @@ Screen {
     id: root
 
     readonly property bool connected: _phoneSource.callConnected
-    readonly property string caller: _phoneSource.callerName.length > 0 ? _phoneSource.callerName : _phoneSource.callerNumber
+    readonly property string caller: _phoneSource.callerName.length > 0 ? _phoneSource.callerName : _phoneSource.callerNumber.length > 0 ? _phoneSource.callerNumber : qsTr("Unknown caller")
+
+    readonly property bool blocked: _eaPhoneSource.eventsBlocked
 
     title: qsTr("Call")
 
-    function clock(seconds) {
-        const rest = seconds % 60;
-        return Math.floor(seconds / 60) + ":" + (rest < 10 ? "0" : "") + rest;
+    EmergencyNote {
+        anchors { left: parent.left; right: parent.right; top: parent.top; leftMargin: Theme.margin; rightMargin: Theme.margin }
     }
 
     Column {
@@ -47,9 +48,19 @@ Screen {
         Label {
             width: parent.width
             horizontalAlignment: Text.AlignHCenter
-            content: root.connected ? root.clock(_phoneSource.callDuration) : _phoneSource.dialling ? qsTr("Dialling…") : ""
+            objectName: "callState"
+            content: root.connected ? Format.duration(_phoneSource.callDuration) : _phoneSource.dialling ? qsTr("Dialling…") : ""
             color: Theme.textMuted
             font.pixelSize: Theme.textTitle
+        }
+
+        Label {
+            objectName: "privateNote"
+            width: parent.width
+            horizontalAlignment: Text.AlignHCenter
+            visible: root.connected && _phoneSource.privateMode
+            content: qsTr("Heard on the phone, not in the car")
+            color: Theme.accent
         }
     }
 
@@ -62,7 +73,7 @@ Screen {
             width: Theme.px(340)
             text: _phoneSource.privateMode ? qsTr("Back to the car") : qsTr("On the phone")
             icon: _phoneSource.privateMode ? "volume" : "phone"
-            active: root.connected
+            active: root.connected && !root.blocked
             color: Theme.surface
             onClicked: _phoneSource.setPrivateMode(!_phoneSource.privateMode)
         }
@@ -74,7 +85,7 @@ Screen {
             icon: "phone-hangup"
             color: Theme.negative
             textColor: Theme.signalText
-            active: root.connected || _phoneSource.dialling
+            active: (root.connected || _phoneSource.dialling) && !root.blocked
             onClicked: _phoneSource.hangUp()
         }
     }

@@ -1,17 +1,26 @@
 // SPDX-License-Identifier: MIT
 import QtQuick 2.15
+import HmiIntents 1.0
 import HmiUi 1.0
 
 /// The phone that is connected, and its contacts.
 Screen {
     id: root
 
+    readonly property HmiIntentMonitor calling: HmiIntents.intentMonitor(HmiIntents.MakePhoneCall)
+
     title: qsTr("Phone")
+
+    EmergencyNote {
+        id: emergency
+
+        anchors { left: parent.left; right: parent.right; top: parent.top; leftMargin: Theme.margin; rightMargin: Theme.margin }
+    }
 
     Card {
         id: device
 
-        anchors { left: parent.left; top: parent.top; bottom: parent.bottom; leftMargin: Theme.margin; bottomMargin: Theme.margin }
+        anchors { left: parent.left; top: emergency.bottom; bottom: parent.bottom; topMargin: emergency.visible ? Theme.gap : 0; leftMargin: Theme.margin; bottomMargin: Theme.margin }
         width: Math.round(parent.width * 0.32)
 
         Column {
@@ -19,6 +28,7 @@ Screen {
             spacing: Theme.gap
 
             Icon {
+                anchors.left: parent.left
                 name: "bluetooth"
                 size: Theme.px(48)
                 color: Theme.accent
@@ -46,8 +56,8 @@ Screen {
             anchors { left: parent.left; right: parent.right; bottom: parent.bottom; margins: Theme.margin }
             icon: "keypad"
             text: qsTr("Keypad")
-            active: _phoneSource.deviceName.length > 0
-            onClicked: _viewManager.requestView("PHONE.Keypad")
+            active: root.calling.enabled
+            onClicked: HmiIntents.requestAction(HmiIntents.MakePhoneCall)
         }
     }
 
@@ -55,7 +65,7 @@ Screen {
         id: contactsCard
 
         anchors {
-            left: device.right; right: parent.right; top: parent.top; bottom: parent.bottom
+            left: device.right; right: parent.right; top: device.top; bottom: parent.bottom
             leftMargin: Theme.gap; rightMargin: Theme.margin; bottomMargin: Theme.margin
         }
     }
@@ -80,7 +90,9 @@ Screen {
             icon: "contacts"
             title: modelData.name
             subtitle: modelData.number
-            onClicked: _phoneSource.dial(modelData.number)
+            active: root.calling.enabled
+            dimmed: !root.calling.enabled
+            onClicked: HmiIntents.requestAction(HmiIntents.MakePhoneCall, [modelData.number])
         }
     }
 }

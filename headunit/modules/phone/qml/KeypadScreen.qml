@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 import QtQuick 2.15
+import HmiIntents 1.0
 import HmiUi 1.0
 
 /// Dialling a number by hand.
@@ -7,14 +8,21 @@ Screen {
     id: root
 
     property string number
+    readonly property HmiIntentMonitor calling: HmiIntents.intentMonitor(HmiIntents.MakePhoneCall)
 
     title: qsTr("Keypad")
+
+    EmergencyNote {
+        id: emergency
+
+        anchors { left: parent.left; right: parent.right; top: parent.top; leftMargin: Theme.margin; rightMargin: Theme.margin }
+    }
 
     Label {
         id: display
 
         objectName: "dialledNumber"
-        anchors { left: parent.left; right: parent.right; top: parent.top; leftMargin: Theme.margin; rightMargin: Theme.margin }
+        anchors { left: parent.left; right: parent.right; top: emergency.bottom; leftMargin: Theme.margin; rightMargin: Theme.margin }
         height: Theme.px(84)
         horizontalAlignment: Text.AlignHCenter
         elide: Text.ElideLeft // the end is what was just typed
@@ -68,8 +76,8 @@ Screen {
             text: qsTr("Call")
             color: Theme.positive
             textColor: Theme.signalText
-            active: root.number.length > 0
-            onClicked: _phoneSource.dial(root.number)
+            active: root.number.length > 0 && root.calling.enabled
+            onClicked: HmiIntents.requestAction(HmiIntents.MakePhoneCall, [root.number])
         }
 
         IconButton {

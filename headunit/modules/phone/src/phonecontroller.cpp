@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "phonecontroller.h"
 
+#include "conditionalpopup.h"
+
 #include <AL2HMIBridge/PhoneSource>
 #include <HmiGuiFramework/DataStore>
 #include <HmiGuiFramework/ViewManager>
@@ -20,6 +22,11 @@ ViewManager* viewManager()
     return DataStore::get<ViewManager>(QStringLiteral("ViewManager"));
 }
 
+bool isAssistantListening()
+{
+    return PhoneSource::instance()->siriActive() || PhoneSource::instance()->phoneVoiceServiceActive();
+}
+
 } // namespace
 
 PhoneController::PhoneController(QObject* parent)
@@ -28,6 +35,9 @@ PhoneController::PhoneController(QObject* parent)
     connect(PhoneSource::instance(), &PhoneSource::incomingCallChanged, this, &PhoneController::update);
     connect(PhoneSource::instance(), &PhoneSource::callConnectedChanged, this, &PhoneController::update);
     connect(PhoneSource::instance(), &PhoneSource::diallingChanged, this, &PhoneController::update);
+    auto* const assistant = new ConditionalPopup(assistantPopup(), isAssistantListening, this);
+    assistant->watch(PhoneSource::instance(), &PhoneSource::siriActiveChanged,
+                     &PhoneSource::phoneVoiceServiceActiveChanged);
     // A call may be there before the screens are.
     connect(StateMachine::instance(), &QStateMachine::started, this, &PhoneController::update);
 }
@@ -35,6 +45,16 @@ PhoneController::PhoneController(QObject* parent)
 QString PhoneController::incomingCallPopup()
 {
     return QStringLiteral("PHONE.IncomingCall");
+}
+
+QString PhoneController::assistantPopup()
+{
+    return QStringLiteral("PHONE.Assistant");
+}
+
+QString PhoneController::assistantHintPopup()
+{
+    return QStringLiteral("PHONE.AssistantHint");
 }
 
 void PhoneController::update()

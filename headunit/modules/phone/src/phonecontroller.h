@@ -3,7 +3,8 @@
 
 #include <QObject>
 
-/// \brief Brings calls to the screen: the popup of an incoming call and the view of a running one. GUI thread only.
+/// \brief Brings calls to the screen: the popup of an incoming call and the view of a running one; and the phone's assistant.
+/// GUI thread only.
 class PhoneController : public QObject
 {
     Q_OBJECT
@@ -13,6 +14,10 @@ public:
 
     /// \brief Name of the popup, of its state, and of the key signal that asks for it.
     static QString incomingCallPopup();
+
+    /// \brief Names of the popups of the phone's assistant: it listens; it is switched off.
+    static QString assistantPopup();
+    static QString assistantHintPopup();
 
 private:
     void update();

@@ -2,10 +2,15 @@
 #include "phonemodule.h"
 
 #include "../../moduledomains.h"
+#include "intenttable.h"
+#include "moduletranslation.h"
 #include "phonecontroller.h"
+#include "phoneintents.h"
 #include "phonesettings.h"
 
+#include <AL2HMIBridge/EAPhoneSource>
 #include <AL2HMIBridge/PhoneSource>
+#include <HmiCore/HmiIntentManager>
 #include <HmiCore/HmiSubmoduleProvider>
 #include <HmiStateMachine/HmiLayeredState>
 #include <HmiStateMachine/KeySignalTransition>
@@ -24,6 +29,7 @@ using HmiStateMachine::StateLevel;
 PhoneModule::PhoneModule(QObject* parent)
     : HmiModuleIntegration(RootModule, parent)
     , m_controller(new PhoneController(this))
+    , m_intents(makePhoneIntents(this))
 {
     // Registered before the settings module has a place for it; it is built when that arrives.
     HmiCore::HmiSubmoduleProvider::instance()->registerHostedSubmodule(ModuleDomain::Settings, new PhoneSettings(this));
@@ -31,7 +37,7 @@ PhoneModule::PhoneModule(QObject* parent)
 
 QString PhoneModule::moduleName() const
 {
-    return QStringLiteral("Phone");
+    return QString::fromLatin1(QT_TRANSLATE_NOOP("Modules", "Phone"));
 }
 
 int PhoneModule::modulePriority() const
@@ -67,6 +73,8 @@ NamedState* PhoneModule::createRootState(HmiState* modulesRootState)
     new HmiState(QStringLiteral("PHONE.Call"), root);
 
     m_incomingCall = new PopupState(PhoneController::incomingCallPopup());
+    m_popups = {m_incomingCall, new PopupState(PhoneController::assistantPopup()),
+                new PopupState(PhoneController::assistantHintPopup())};
     m_toIncomingCall = new KeySignalTransition(PhoneController::incomingCallPopup(), modulesRootState, m_incomingCall);
     return root;
 }
@@ -78,11 +86,17 @@ QList<QPair<StateLevel, QAbstractTransition*>> PhoneModule::moduleRootHierarchyT
 
 QList<QPair<StateLevel, PopupState*>> PhoneModule::moduleRootHierarchyPopupStates() const
 {
-    return {{HmiStateMachine::PopupLevel, m_incomingCall}};
+    QList<QPair<StateLevel, PopupState*>> states;
+    for (PopupState* const popup : m_popups)
+        states.append({HmiStateMachine::PopupLevel, popup});
+    return states;
 }
 
 void PhoneModule::setupRootContext(QQmlContext* rootContext)
 {
+    registerModuleTranslation(QStringLiteral("phone"), this);
+    HmiCore::HmiIntentManager::instance()->registerIntentHandler(m_intents);
     rootContext->setContextProperty(QStringLiteral("_phone"), m_controller);
     rootContext->setContextProperty(QStringLiteral("_phoneSource"), AL2HMIBridge::PhoneSource::instance());
+    rootContext->setContextProperty(QStringLiteral("_eaPhoneSource"), AL2HMIBridge::EAPhoneSource::instance());
 }

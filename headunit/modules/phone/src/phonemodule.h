@@ -3,6 +3,7 @@
 
 #include <HmiCore/HmiModuleIntegration>
 
+class IntentTable;
 class PhoneController;
 
 /// \brief The phone: contacts, keypad, calls; and its page in the settings.
@@ -27,6 +28,8 @@ public:
 
 private:
     PhoneController* const m_controller;
+    IntentTable* const m_intents;
+    QList<HmiStateMachine::PopupState*> m_popups;
     HmiStateMachine::PopupState* m_incomingCall = nullptr;
     QAbstractTransition* m_toIncomingCall = nullptr;
 };

@@ -1,10 +1,12 @@
 // SPDX-License-Identifier: MIT
 #include "phonesettings.h"
 
+#include <HmiCore/HmiManager>
 #include <HmiGuiFramework/HmiAction>
 #include <HmiGuiFramework/RequestView>
 #include <HmiStateMachine/HmiState>
 
+using HmiCore::HmiManager;
 using HmiGuiFramework::HmiAction;
 using HmiGuiFramework::RequestView;
 
@@ -16,7 +18,9 @@ PhoneSettings::PhoneSettings(QObject* parent)
     : HmiHostedSubmodule(parent)
     , m_entryAction(new HmiAction(this))
 {
-    m_entryAction->setText(tr("Phone"));
+    const auto translate = [this] { m_entryAction->setText(tr("Phone")); };
+    translate();
+    connect(HmiManager::instance(), &HmiManager::hmiRetranslated, this, translate);
     m_entryAction->setIcon(QStringLiteral("phone"));
     m_entryAction->setOrder(30);
     connect(m_entryAction, &HmiAction::triggered, this, RequestView(mainView, QVariant(), false, QVariant()));

@@ -9,6 +9,8 @@ Item {
     property int number: 0
     property var preset: ({})
     property bool current: false
+    property bool focused: false // the knob is at it
+    property bool recalled: false // a key far from the screen has just chosen it
 
     signal clicked()
     signal held()
@@ -24,8 +26,18 @@ Item {
         color: area.pressed ? Theme.surfacePressed : root.current ? Theme.accent : Theme.surface
 
         Behavior on color {
-            ColorAnimation { duration: Theme.durationShort }
+            ColorAnimation { duration: Theme.durationShort; easing.type: Theme.easing }
         }
+    }
+
+    Rectangle {
+        objectName: "recalledRing"
+        anchors { fill: parent; margins: -Theme.px(6) }
+        visible: root.recalled
+        radius: Theme.radius + Theme.px(6)
+        color: "transparent"
+        border.width: Theme.px(4)
+        border.color: Theme.accent
     }
 
     Column {
@@ -50,6 +62,10 @@ Item {
             font.weight: Font.DemiBold
             font.pixelSize: Theme.px(22)
         }
+    }
+
+    FocusRing {
+        shown: root.focused
     }
 
     MouseArea {

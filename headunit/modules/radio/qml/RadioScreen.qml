@@ -1,14 +1,26 @@
 // SPDX-License-Identifier: MIT
 import QtQuick 2.15
+import HmiCore 1.0
 import HmiUi 1.0
 
-/// The station that is heard, and the six presets of the bank.
+/// What is heard of the band, and the six presets of the bank.
 Screen {
     id: root
 
-    readonly property QtObject tuner: _radio.tuner
+    readonly property var tuner: _radio.tuner
 
     title: qsTr("Radio")
+
+    Connections {
+        target: HardKeyController
+
+        function onSwcSeekDownShortPress() { presets.followWheel(); }
+        function onSwcSeekUpShortPress() { presets.followWheel(); }
+        function onSwcSeekDownLongPress() { down.held = true; }
+        function onSwcSeekDownLongRelease() { down.held = false; }
+        function onSwcSeekUpLongPress() { up.held = true; }
+        function onSwcSeekUpLongRelease() { up.held = false; }
+    }
 
     SegmentedControl {
         id: bands
@@ -25,6 +37,25 @@ Screen {
         spacing: Theme.gap
 
         IconButton {
+            objectName: "toggleTraffic"
+            visible: _radio.hasAnnouncements
+            icon: "traffic"
+            iconColor: root.tuner.trafficAnnouncementEnabled ? Theme.accent : Theme.text
+            fill: root.tuner.trafficAnnouncementEnabled ? Theme.accentSoft : Theme.surface
+            label: qsTr("Traffic announcements")
+            onClicked: _radio.toggleTrafficAnnouncements()
+        }
+
+        IconButton {
+            objectName: "autoStore"
+            icon: "autostore"
+            label: qsTr("Store the strongest stations")
+            fill: Theme.surface
+            active: !root.tuner.autoStoreInProgress
+            onClicked: root.tuner.startAutoStore()
+        }
+
+        IconButton {
             objectName: "openSound"
             icon: "sound"
             label: qsTr("Sound")
@@ -39,15 +70,25 @@ Screen {
             fill: Theme.surface
             onClicked: _viewManager.requestView("RADIO.Stations")
         }
+
+        IconButton {
+            objectName: "openSources"
+            icon: "source"
+            label: qsTr("Sources")
+            fill: Theme.surface
+            onClicked: _viewManager.requestPopup("SYSTEM.AudioSources")
+        }
     }
 
     Item {
         id: station
 
-        anchors { left: parent.left; right: parent.right; top: bands.bottom; bottom: presets.top; margins: Theme.margin }
+        anchors { left: parent.left; right: parent.right; top: bands.bottom; bottom: lowerEdge.top; margins: Theme.margin }
 
         IconButton {
             id: down
+
+            property bool held: false // on the steering wheel
 
             objectName: "seekDown"
             anchors { left: parent.left; verticalCenter: parent.verticalCenter }
@@ -57,80 +98,26 @@ Screen {
             icon: "seek-down"
             label: qsTr("Seek down")
             mirrorsWithLayout: true
-            fill: Theme.surface
+            fill: held ? Theme.accentSoft : Theme.surface
             onClicked: _radio.seekDown()
         }
 
-        Column {
+        StationDisplay {
             anchors { left: down.right; right: up.left; margins: Theme.margin; verticalCenter: parent.verticalCenter }
-            spacing: Theme.gap / 2
+            visible: !_radio.satellite
+            tuner: root.tuner
+            heardOnFm: _radio.fm
+        }
 
-            Row {
-                anchors.horizontalCenter: parent.horizontalCenter
-                spacing: Theme.gap
-                LayoutMirroring.enabled: false // a number and its unit read from left to right everywhere
-
-                Label {
-                    id: frequency
-
-                    objectName: "frequency"
-                    content: root.tuner.frequency
-                    font.pixelSize: Theme.textDisplay
-                    font.weight: Font.Light
-                }
-
-                Label {
-                    anchors.baseline: frequency.baseline
-                    content: root.tuner.frequencyUnit
-                    color: Theme.textMuted
-                    font.pixelSize: Theme.textTitle
-                }
-            }
-
-            Label {
-                objectName: "stationName"
-                width: parent.width
-                horizontalAlignment: Text.AlignHCenter
-                content: root.tuner.seeking ? qsTr("Searching…") : root.tuner.stationName
-                font.pixelSize: Theme.textTitle
-                font.weight: Font.DemiBold
-            }
-
-            Label {
-                width: parent.width
-                horizontalAlignment: Text.AlignHCenter
-                wrapMode: Text.Wrap
-                maximumLineCount: 2
-                content: root.tuner.radioText
-                color: Theme.textMuted
-            }
-
-            Row {
-                anchors.horizontalCenter: parent.horizontalCenter
-                spacing: Theme.gap / 2
-                visible: root.tuner.trafficAnnouncementEnabled
-
-                Rectangle {
-                    width: badge.implicitWidth + Theme.gap
-                    height: badge.implicitHeight + Theme.gap / 4
-                    radius: Theme.px(6)
-                    color: Theme.accentSoft
-
-                    Label {
-                        id: badge
-
-                        anchors.centerIn: parent
-                        content: qsTr("TA")
-                        color: Theme.accent
-                        font.pixelSize: Theme.textCaption
-                        font.weight: Font.Bold
-                    }
-                }
-            }
+        SatelliteDisplay {
+            anchors { left: down.right; right: up.left; margins: Theme.margin; verticalCenter: parent.verticalCenter }
+            visible: _radio.satellite
         }
 
         IconButton {
             id: up
+
+            property bool held: false // on the steering wheel
 
             objectName: "seekUp"
             anchors { right: parent.right; verticalCenter: parent.verticalCenter }
@@ -140,42 +127,32 @@ Screen {
             icon: "seek-up"
             label: qsTr("Seek up")
             mirrorsWithLayout: true
-            fill: Theme.surface
+            fill: held ? Theme.accentSoft : Theme.surface
             onClicked: _radio.seekUp()
         }
     }
 
-    Row {
-        id: presets
-
-        readonly property real tileWidth: (width - 5 * spacing) / 6
+    Item {
+        id: lowerEdge
 
         anchors { left: parent.left; right: parent.right; bottom: parent.bottom; margins: Theme.margin }
-        spacing: Theme.gap
-        layoutDirection: Theme.mirrored ? Qt.RightToLeft : Qt.LeftToRight
-        LayoutMirroring.enabled: false // mirrored by its layout direction
+        height: Theme.px(124)
 
-        Repeater {
-            model: 6
+        PresetBar {
+            id: presets
 
-            PresetTile {
-                objectName: "preset" + (index + 1)
-                width: presets.tileWidth
-                number: index + 1
-                preset: root.presetAt(index)
-                current: root.tuner.activePreset === index + 1
-                onClicked: _radio.recallPreset(number)
-                onHeld: _radio.storePreset(number)
-            }
+            anchors.fill: parent
+            visible: !autoStore.visible
+            tuner: root.tuner
         }
-    }
 
-    /// The preset in a place of the active bank, or an empty object.
-    function presetAt(place) {
-        const all = root.tuner.presets;
-        for (let i = 0; i < all.length; ++i)
-            if (all[i].bank === root.tuner.activePresetBank && all[i].index === place + 1)
-                return all[i];
-        return {};
+        AutoStoreBar {
+            id: autoStore
+
+            anchors.fill: parent
+            visible: root.tuner.autoStoreInProgress
+            progress: root.tuner.autoStoreProgress
+            onCancelled: root.tuner.sendAutoStoreCancel()
+        }
     }
 }

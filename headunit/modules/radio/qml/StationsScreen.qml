@@ -6,7 +6,7 @@ import HmiUi 1.0
 Screen {
     id: root
 
-    readonly property QtObject tuner: _radio.tuner
+    readonly property var tuner: _radio.tuner
 
     title: qsTr("Stations")
 

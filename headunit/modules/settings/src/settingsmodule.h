@@ -6,6 +6,10 @@
 namespace HmiCore {
 class HmiSubmoduleHost;
 }
+namespace HmiGuiFramework {
+class HmiAction;
+}
+class IntentTable;
 
 /// \brief The settings: pages of its own and a menu in which other modules have pages.
 class SettingsModule : public HmiCore::HmiModuleIntegration
@@ -25,7 +29,10 @@ public:
     void setupRootContext(QQmlContext* rootContext) override;
 
 private:
-    void addPage(const QString& view, const QString& text, const QString& icon, int order);
+    HmiGuiFramework::HmiAction* addEntry(const char* text, const QString& icon, int order);
+    void addPage(const QString& view, const char* text, const QString& icon, int order);
+    void addIntent(int intent, const char* text, const QString& icon, int order);
 
+    IntentTable* const m_intents;
     HmiCore::HmiSubmoduleHost* m_host = nullptr;
 };

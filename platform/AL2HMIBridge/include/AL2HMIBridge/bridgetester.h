@@ -25,8 +25,8 @@ public:
     /// \brief A call that left.
     struct Call
     {
-        QString source;
-        QString name;
+        QString source;         ///< class name of the source
+        QString name;           ///< of the call
         QVariantList arguments; ///< enumerations as numbers; whole numbers as int
 
         /// \brief Such as `GlobalSource.setAudioSource(12, -1)` or `FMTunerSource.tune("98.5", "-1")`.
@@ -40,10 +40,12 @@ public:
 
     /// \brief Sets state as one message does: all of it, or, after the usual warning, nothing and false.
     static bool setState(const QString& source, const QVariantMap& state);
+    /// \brief As above, written out.
     static bool setState(const char* source, std::initializer_list<std::pair<const char*, QVariant>> state);
 
     /// \brief Sends an event as a message does; false after the usual warning.
     static bool sendEvent(const QString& source, const QString& event, const QVariantList& arguments = {});
+    /// \brief As above, written out.
     static bool sendEvent(const char* source, const char* event, const QVariantList& arguments = {});
 
     /// \brief Gives a line of the protocol to its channel's reader; false after the usual warning.

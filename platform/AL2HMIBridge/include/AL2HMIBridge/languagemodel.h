@@ -13,6 +13,7 @@ class AL2HMIBRIDGE_EXPORT LanguageModel : public QAbstractListModel
     Q_OBJECT
 
 public:
+    /// \brief What a row tells.
     enum Role : int {
         LocaleRole = 1, ///< locale name, such as de_DE
         NameRole = 2,   ///< name as shown, in the language itself

@@ -25,6 +25,7 @@ protected:
 
     /// Sends a call of this source without waiting; without a peer it is reported and dropped.
     void send(const char* call) const;
+    /// As above, with arguments in the order of the call's declaration.
     void send(const char* call, const QJsonArray& arguments) const;
 
 private:

@@ -38,7 +38,7 @@ public:
     QSize windowSize() const { return m_windowSize; } ///< pixels; 1280 × 720 by default
     void setWindowSize(const QSize& size);            ///< an empty size is ignored
 
-    bool fullScreen() const { return m_fullScreen; }
+    bool fullScreen() const { return m_fullScreen; } ///< whether the window covers the screen; false by default
     void setFullScreen(bool fullScreen);
 
     bool rightToLeft() const { return m_rightToLeft; } ///< whether the layout is mirrored, as for Arabic

@@ -14,9 +14,9 @@ namespace HmiGuiFramework {
 class HMIGUIFRAMEWORK_EXPORT FrameworkTester
 {
 public:
-    static void hmiViewRequest(const QString& name);
-    static void hmiViewBatchRequest(const QList<QString>& names); ///< each as soon as the one before is shown
-    static void hmiPopupRequest(const QString& name);
+    static void hmiViewRequest(const QString& name);               ///< as ViewManager::requestView()
+    static void hmiViewBatchRequest(const QList<QString>& names);  ///< each as soon as the one before is shown
+    static void hmiPopupRequest(const QString& name);              ///< as ViewManager::requestPopup()
     static void hmiPopupBatchRequest(const QList<QString>& names); ///< all at once; priorities decide what is on top
 };
 

@@ -42,7 +42,7 @@ Q_SIGNALS:
     void iconChanged();
     void orderChanged();
     void enabledChanged();
-    void triggered();
+    void triggered(); ///< chosen by the user, while enabled
 
 private:
     QString m_text;

@@ -30,7 +30,7 @@ public:
     /// \brief Sorts by HmiAction::order; actions of one order keep their places among each other.
     void sortActions();
 
-    int count() const { return int(m_actions.size()); }
+    int count() const { return int(m_actions.size()); } ///< of actions
 
     int rowCount(const QModelIndex& parent = QModelIndex()) const override;
     QVariant data(const QModelIndex& index, int role = Qt::DisplayRole) const override;

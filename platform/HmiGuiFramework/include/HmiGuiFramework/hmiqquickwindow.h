@@ -14,6 +14,7 @@ class HMIGUIFRAMEWORK_EXPORT HmiQQuickWindow : public QQuickWindow
     Q_OBJECT
 
 public:
+    /// \brief Not shown yet.
     explicit HmiQQuickWindow(QWindow* parent = nullptr);
     ~HmiQQuickWindow() override;
 

@@ -14,6 +14,7 @@ namespace HmiGuiFramework {
 class HMIGUIFRAMEWORK_EXPORT RequestPopup
 {
 public:
+    /// \brief Keeps what to ask for; asks for nothing yet.
     RequestPopup(HmiStateMachine::PopupState* state, const QVariant& data);
 
     /// \brief Makes the request. Without a view manager, or when the state is gone, it gives one warning.

@@ -12,7 +12,7 @@ namespace HmiGuiFramework {
 /// \brief A short notice in the status bar, such as the volume.
 struct HMIGUIFRAMEWORK_EXPORT TransientDescriptor
 {
-    QString identifier;
+    QString identifier;   ///< prefix, dot, own name
     QString componentKey; ///< of the component that draws it
     int timeout = 0;      ///< milliseconds that it stays
 };
@@ -20,7 +20,7 @@ struct HMIGUIFRAMEWORK_EXPORT TransientDescriptor
 /// \brief A QML file that draws transients.
 struct HMIGUIFRAMEWORK_EXPORT ComponentDescriptor
 {
-    QUrl url;
+    QUrl url; ///< of the QML file
 };
 
 /// \brief All transients that are loaded. A plain value.

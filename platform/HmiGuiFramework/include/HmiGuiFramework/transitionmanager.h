@@ -29,6 +29,7 @@ class HMIGUIFRAMEWORK_EXPORT TransitionManager : public QObject
         QString defaultTransition READ defaultTransition WRITE setDefaultTransition NOTIFY defaultTransitionChanged)
 
 public:
+    /// \brief How one view follows another; the slides are mirrored with the layout.
     enum Transition { None, Fade, SlideForward, SlideBackward };
     Q_ENUM(Transition)
 
@@ -38,7 +39,7 @@ public:
     /// \brief Whether this is the name of a transition.
     static bool isTransition(const QString& name);
 
-    bool isRunning() const { return m_animation != nullptr; }
+    bool isRunning() const { return m_animation != nullptr; } ///< whether a transition is on the screen
 
     int duration() const { return m_duration; } ///< milliseconds; 220 by default
     void setDuration(int milliseconds);         ///< 0 or less turns all animation off
@@ -60,7 +61,7 @@ Q_SIGNALS:
     void runningChanged();
     void durationChanged();
     void defaultTransitionChanged();
-    void finished();
+    void finished(); ///< the next item is on the screen alone
 
 private:
     Transition effective(const QString& name, bool reverse) const;

@@ -18,6 +18,7 @@ class HMISTATEMACHINE_EXPORT HmiLayeredState : public HmiState
     Q_PROPERTY(int depth READ depth NOTIFY depthChanged)
 
 public:
+    /// \brief As NamedState.
     explicit HmiLayeredState(const Identifier& name, QState* parent = nullptr);
     ~HmiLayeredState() override;
 

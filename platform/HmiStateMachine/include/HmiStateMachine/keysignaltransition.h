@@ -18,11 +18,13 @@ class HMISTATEMACHINE_EXPORT KeySignalTransition : public QAbstractTransition
     Q_PROPERTY(QString keySignal READ keySignal CONSTANT)
 
 public:
+    /// \brief Works in \a sourceState, which owns it; leads nowhere until setTargetState().
     explicit KeySignalTransition(const Identifier& keySignal, QState* sourceState = nullptr);
+    /// \brief As above, and leads to \a target.
     KeySignalTransition(const Identifier& keySignal, QState* sourceState, QAbstractState* target);
     ~KeySignalTransition() override;
 
-    QString keySignal() const { return m_keySignal; }
+    QString keySignal() const { return m_keySignal; } ///< what triggers it
 
     /// \brief Publishes the transition: its key signal is handled from anywhere in the state tree.
     ///

@@ -18,11 +18,13 @@ class HMISTATEMACHINE_EXPORT NamedState : public QState
     Q_PROPERTY(QString name READ name CONSTANT)
 
 public:
+    /// \brief Owned by \a parent; one child at a time is active.
     explicit NamedState(const Identifier& name, QState* parent = nullptr);
+    /// \brief As above, with exclusive or parallel children.
     NamedState(const Identifier& name, QState::ChildMode mode, QState* parent = nullptr);
     ~NamedState() override;
 
-    QString name() const { return m_name; }
+    QString name() const { return m_name; } ///< never changes
 
 protected:
     void onEntry(QEvent* event) override;

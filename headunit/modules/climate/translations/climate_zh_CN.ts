@@ -1,0 +1,169 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="zh_CN">
+<context>
+    <name>AirKeys</name>
+    <message>
+        <source>Windscreen</source>
+        <translation>前挡风玻璃</translation>
+    </message>
+    <message>
+        <source>Face</source>
+        <translation>面部</translation>
+    </message>
+    <message>
+        <source>Feet</source>
+        <translation>脚部</translation>
+    </message>
+</context>
+<context>
+    <name>Climate</name>
+    <message>
+        <source>This temperature cannot be set</source>
+        <translation>无法设置此温度</translation>
+    </message>
+</context>
+<context>
+    <name>ClimateNotice</name>
+    <message>
+        <source>Climate</source>
+        <translation>空调</translation>
+    </message>
+    <message>
+        <source>Temperature</source>
+        <translation>温度</translation>
+    </message>
+    <message>
+        <source>Seat heating</source>
+        <translation>座椅加热</translation>
+    </message>
+    <message>
+        <source>Fan</source>
+        <translation>风量</translation>
+    </message>
+    <message>
+        <source>Air direction</source>
+        <translation>出风方向</translation>
+    </message>
+    <message>
+        <source>Automatic</source>
+        <translation>自动</translation>
+    </message>
+    <message>
+        <source>Cooling</source>
+        <translation>制冷</translation>
+    </message>
+    <message>
+        <source>Recirculation</source>
+        <translation>内循环</translation>
+    </message>
+    <message>
+        <source>Windscreen</source>
+        <translation>前挡风玻璃</translation>
+    </message>
+    <message>
+        <source>Rear window</source>
+        <translation>后窗</translation>
+    </message>
+    <message>
+        <source>Both sides alike</source>
+        <translation>两侧同步</translation>
+    </message>
+    <message>
+        <source>On</source>
+        <translation>开</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>关</translation>
+    </message>
+</context>
+<context>
+    <name>ClimateScreen</name>
+    <message>
+        <source>Climate</source>
+        <translation>空调</translation>
+    </message>
+    <message>
+        <source>Driver</source>
+        <translation>主驾</translation>
+    </message>
+    <message>
+        <source>Passenger</source>
+        <translation>副驾</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>关</translation>
+    </message>
+    <message>
+        <source>Defrosting</source>
+        <translation>除霜中</translation>
+    </message>
+    <message>
+        <source>Automatic</source>
+        <translation>自动</translation>
+    </message>
+    <message>
+        <source>By hand</source>
+        <translation>手动</translation>
+    </message>
+    <message>
+        <source>On</source>
+        <translation>开</translation>
+    </message>
+    <message>
+        <source>Cooling</source>
+        <translation>制冷</translation>
+    </message>
+    <message>
+        <source>Recirculation</source>
+        <translation>内循环</translation>
+    </message>
+    <message>
+        <source>Defrost</source>
+        <translation>除霜</translation>
+    </message>
+    <message>
+        <source>Rear window</source>
+        <translation>后窗</translation>
+    </message>
+    <message>
+        <source>Both sides</source>
+        <translation>同步</translation>
+    </message>
+</context>
+<context>
+    <name>ClimateZone</name>
+    <message>
+        <source>Warmer</source>
+        <translation>升温</translation>
+    </message>
+    <message>
+        <source>Cooler</source>
+        <translation>降温</translation>
+    </message>
+    <message>
+        <source>Seat heating</source>
+        <translation>座椅加热</translation>
+    </message>
+</context>
+<context>
+    <name>FanControl</name>
+    <message>
+        <source>Less air</source>
+        <translation>减小风量</translation>
+    </message>
+    <message>
+        <source>More air</source>
+        <translation>加大风量</translation>
+    </message>
+</context>
+<context>
+    <name>Modules</name>
+    <message>
+        <source>Climate</source>
+        <translation>空调</translation>
+    </message>
+</context>
+</TS>

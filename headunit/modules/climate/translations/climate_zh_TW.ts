@@ -1,0 +1,169 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="zh_TW">
+<context>
+    <name>AirKeys</name>
+    <message>
+        <source>Windscreen</source>
+        <translation>前擋風玻璃</translation>
+    </message>
+    <message>
+        <source>Face</source>
+        <translation>面部</translation>
+    </message>
+    <message>
+        <source>Feet</source>
+        <translation>腳部</translation>
+    </message>
+</context>
+<context>
+    <name>Climate</name>
+    <message>
+        <source>This temperature cannot be set</source>
+        <translation>無法設定此溫度</translation>
+    </message>
+</context>
+<context>
+    <name>ClimateNotice</name>
+    <message>
+        <source>Climate</source>
+        <translation>空調</translation>
+    </message>
+    <message>
+        <source>Temperature</source>
+        <translation>溫度</translation>
+    </message>
+    <message>
+        <source>Seat heating</source>
+        <translation>座椅加熱</translation>
+    </message>
+    <message>
+        <source>Fan</source>
+        <translation>風量</translation>
+    </message>
+    <message>
+        <source>Air direction</source>
+        <translation>出風方向</translation>
+    </message>
+    <message>
+        <source>Automatic</source>
+        <translation>自動</translation>
+    </message>
+    <message>
+        <source>Cooling</source>
+        <translation>冷氣</translation>
+    </message>
+    <message>
+        <source>Recirculation</source>
+        <translation>內循環</translation>
+    </message>
+    <message>
+        <source>Windscreen</source>
+        <translation>前擋風玻璃</translation>
+    </message>
+    <message>
+        <source>Rear window</source>
+        <translation>後窗</translation>
+    </message>
+    <message>
+        <source>Both sides alike</source>
+        <translation>兩側同步</translation>
+    </message>
+    <message>
+        <source>On</source>
+        <translation>開</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>關</translation>
+    </message>
+</context>
+<context>
+    <name>ClimateScreen</name>
+    <message>
+        <source>Climate</source>
+        <translation>空調</translation>
+    </message>
+    <message>
+        <source>Driver</source>
+        <translation>駕駛</translation>
+    </message>
+    <message>
+        <source>Passenger</source>
+        <translation>乘客</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>關</translation>
+    </message>
+    <message>
+        <source>Defrosting</source>
+        <translation>除霜中</translation>
+    </message>
+    <message>
+        <source>Automatic</source>
+        <translation>自動</translation>
+    </message>
+    <message>
+        <source>By hand</source>
+        <translation>手動</translation>
+    </message>
+    <message>
+        <source>On</source>
+        <translation>開</translation>
+    </message>
+    <message>
+        <source>Cooling</source>
+        <translation>冷氣</translation>
+    </message>
+    <message>
+        <source>Recirculation</source>
+        <translation>內循環</translation>
+    </message>
+    <message>
+        <source>Defrost</source>
+        <translation>除霜</translation>
+    </message>
+    <message>
+        <source>Rear window</source>
+        <translation>後窗</translation>
+    </message>
+    <message>
+        <source>Both sides</source>
+        <translation>同步</translation>
+    </message>
+</context>
+<context>
+    <name>ClimateZone</name>
+    <message>
+        <source>Warmer</source>
+        <translation>升溫</translation>
+    </message>
+    <message>
+        <source>Cooler</source>
+        <translation>降溫</translation>
+    </message>
+    <message>
+        <source>Seat heating</source>
+        <translation>座椅加熱</translation>
+    </message>
+</context>
+<context>
+    <name>FanControl</name>
+    <message>
+        <source>Less air</source>
+        <translation>減小風量</translation>
+    </message>
+    <message>
+        <source>More air</source>
+        <translation>加大風量</translation>
+    </message>
+</context>
+<context>
+    <name>Modules</name>
+    <message>
+        <source>Climate</source>
+        <translation>空調</translation>
+    </message>
+</context>
+</TS>

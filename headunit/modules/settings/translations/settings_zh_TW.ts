@@ -1,0 +1,133 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="zh_TW">
+<context>
+    <name>AboutScreen</name>
+    <message>
+        <source>About</source>
+        <translation>關於</translation>
+    </message>
+    <message>
+        <source>Head unit</source>
+        <translation>車機系統</translation>
+    </message>
+    <message>
+        <source>Qt</source>
+        <translation>Qt</translation>
+    </message>
+    <message>
+        <source>Modules</source>
+        <translation>模組</translation>
+    </message>
+    <message>
+        <source>Vehicle</source>
+        <translation>車輛</translation>
+    </message>
+    <message>
+        <source>Connected</source>
+        <translation>已連線</translation>
+    </message>
+    <message>
+        <source>Not connected</source>
+        <translation>未連線</translation>
+    </message>
+</context>
+<context>
+    <name>DisplayScreen</name>
+    <message>
+        <source>Display</source>
+        <translation>顯示</translation>
+    </message>
+    <message>
+        <source>Automatic</source>
+        <translation>自動</translation>
+    </message>
+    <message>
+        <source>As the light outside asks for</source>
+        <translation>依車外光線</translation>
+    </message>
+    <message>
+        <source>Day</source>
+        <translation>日間</translation>
+    </message>
+    <message>
+        <source>Always bright</source>
+        <translation>一律淺色</translation>
+    </message>
+    <message>
+        <source>Night</source>
+        <translation>夜間</translation>
+    </message>
+    <message>
+        <source>Always dark</source>
+        <translation>一律深色</translation>
+    </message>
+</context>
+<context>
+    <name>LanguageScreen</name>
+    <message>
+        <source>Language</source>
+        <translation>語言</translation>
+    </message>
+    <message>
+        <source>The language of the vehicle is not offered here. This one is used instead.</source>
+        <translation>此處不提供車輛所設的語言，改用此語言。</translation>
+    </message>
+</context>
+<context>
+    <name>Modules</name>
+    <message>
+        <source>Settings</source>
+        <translation>設定</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsModule</name>
+    <message>
+        <source>Display</source>
+        <translation>顯示</translation>
+    </message>
+    <message>
+        <source>About</source>
+        <translation>關於</translation>
+    </message>
+    <message>
+        <source>Sound</source>
+        <translation>聲音</translation>
+    </message>
+    <message>
+        <source>Darken the display</source>
+        <translation>關閉螢幕</translation>
+    </message>
+    <message>
+        <source>Valet mode</source>
+        <translation>代客泊車模式</translation>
+    </message>
+    <message>
+        <source>Language</source>
+        <translation>語言</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsScreen</name>
+    <message>
+        <source>Settings</source>
+        <translation>設定</translation>
+    </message>
+</context>
+<context>
+    <name>SoundScreen</name>
+    <message>
+        <source>Sound</source>
+        <translation>聲音</translation>
+    </message>
+    <message>
+        <source>Volume</source>
+        <translation>音量</translation>
+    </message>
+    <message>
+        <source>Mute</source>
+        <translation>靜音</translation>
+    </message>
+</context>
+</TS>

@@ -1,0 +1,4 @@
+// SPDX-License-Identifier: MIT
+import QtQuick 2.15
+
+Item {}

@@ -1,0 +1,17 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <HmiCore/ModuleInterface>
+
+#include <QObject>
+
+/// \brief Entry of the plugin: makes one module for each key of sample.json.
+class SamplePlugin : public QObject, public HmiCore::ModuleInterface
+{
+    Q_OBJECT
+    Q_PLUGIN_METADATA(IID "com.kest.ivi.ModuleInterface" FILE "../sample.json")
+    Q_INTERFACES(HmiCore::ModuleInterface)
+
+public:
+    HmiCore::HmiModuleIntegration* createModuleIntegration(const QString& key, QObject* parent) override;
+};
