@@ -2,6 +2,7 @@
 #include "hmihandwritingrecognizerworker.h"
 
 #include "hmihandwritingrecognizer.h"
+#include "workerthreads.h"
 
 #include <QCoreApplication>
 #include <QMutexLocker>
@@ -24,6 +25,7 @@ HmiHandwritingRecognizerWorker::HmiHandwritingRecognizerWorker(HmiHandwritingRec
     , m_gate(std::move(gate))
 {
     moveToThread(m_thread);
+    WorkerThreads::add(m_thread, this);
     using Recognizer = HmiHandwritingRecognizer;
     using Worker = HmiHandwritingRecognizerWorker;
     connect(recognizer, &QObject::destroyed, this, &QObject::deleteLater);

@@ -60,27 +60,37 @@ bool isOfLoneliness(const QString& category, const QString& message)
     return category == noVehicle || message == noHome || message.startsWith(noHandler);
 }
 
-QMutex mutex;
-QStringList keptWarnings; ///< while warnings are kept instead of being problems
-bool keepsWarnings = false;
-int modulesLoaded = -1;
-QJsonArray refusedKeys;
+struct Heard
+{
+    QMutex mutex;
+    QStringList keptWarnings; ///< while warnings are kept instead of being problems
+    bool keepsWarnings = false;
+    int modulesLoaded = -1;
+    QJsonArray refusedKeys;
+};
+
+/// Never destroyed: a plugin's threads may go on to write when the process has begun to end.
+Heard& heard()
+{
+    static auto* const s_heard = new Heard;
+    return *s_heard;
+}
 
 /// "Loaded 2 plugins", and `… key = "radio"`.
 void readCoreLine(const QString& line)
 {
     if (line.startsWith(allLoaded)) {
-        modulesLoaded = line.section(QLatin1Char(' '), 1, 1).toInt();
+        heard().modulesLoaded = line.section(QLatin1Char(' '), 1, 1).toInt();
         ProbeLog::enter("register");
     }
     for (const QLatin1String refusal : refusals)
         if (line.contains(refusal))
-            refusedKeys += line.section(QLatin1Char('"'), -2, -2);
+            heard().refusedKeys += line.section(QLatin1Char('"'), -2, -2);
 }
 
 void handleMessage(QtMsgType type, const QMessageLogContext& context, const QString& message)
 {
-    const QMutexLocker locker(&mutex);
+    const QMutexLocker locker(&heard().mutex);
     const QLatin1String category(context.category);
     if (category == QLatin1String(HmiCore::hmicore().categoryName()))
         readCoreLine(message);
@@ -88,17 +98,17 @@ void handleMessage(QtMsgType type, const QMessageLogContext& context, const QStr
         ProbeLog::tell({{QStringLiteral("fatal"), message}});
     if (type == QtDebugMsg || type == QtInfoMsg || isOfLoneliness(category, message))
         return;
-    if (keepsWarnings)
-        keptWarnings += message;
+    if (heard().keepsWarnings)
+        heard().keptWarnings += message;
     else
         ProbeLog::addProblem(category + QLatin1String(": ") + message);
 }
 
 QStringList takeWarnings()
 {
-    const QMutexLocker locker(&mutex);
-    keepsWarnings = true;
-    return std::exchange(keptWarnings, {});
+    const QMutexLocker locker(&heard().mutex);
+    heard().keepsWarnings = true;
+    return std::exchange(heard().keptWarnings, {});
 }
 
 /// Nothing catches what a plugin throws, so this is the last that runs.
@@ -219,7 +229,7 @@ void describeModules(HmiApplication* application, QQmlEngine* engine)
     for (const HmiModuleIntegration* const module : found)
         modules += moduleDescription(*module);
     ProbeLog::tell({{QStringLiteral("modules"), modules},
-                    {QStringLiteral("modulesMade"), modulesLoaded},
+                    {QStringLiteral("modulesMade"), heard().modulesLoaded},
                     {QStringLiteral("submodules"), submoduleDescriptions()}});
     ProbeLog::enter("qml");
     ProbeLog::tell({{QStringLiteral("views"), viewDescriptions(engine)}});
@@ -249,9 +259,9 @@ void probe(HmiApplication* application, const QString& plugin)
     application->initialize(&initializer);
     if (kind == Kind::Module) {
         describeModules(application, initializer.engine);
-        ProbeLog::tell({{QStringLiteral("refusedKeys"), refusedKeys}});
+        ProbeLog::tell({{QStringLiteral("refusedKeys"), heard().refusedKeys}});
     } else {
-        ProbeLog::tell({{QStringLiteral("refusedKeys"), refusedKeys}});
+        ProbeLog::tell({{QStringLiteral("refusedKeys"), heard().refusedKeys}});
         ProbeLog::enter("engines");
         ProbeLog::tell({{QStringLiteral("engines"), engineLanguages(&takeWarnings)}});
     }
