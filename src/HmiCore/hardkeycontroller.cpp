@@ -15,7 +15,7 @@ using namespace HardKeyRules;
 using namespace HardKeySources;
 
 /// The decisions as tables, tried from above; inside the controller, because they lead to its private operations.
-struct HardKeyController::Rules
+struct Q_DECL_HIDDEN HardKeyController::Rules
 {
     struct KeyRule
     {
