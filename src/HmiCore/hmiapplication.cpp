@@ -11,6 +11,7 @@
 #include "logcategories.h"
 #include "moduleinterface.h"
 #include "pluginfile.h"
+#include "pluginlists.h"
 
 #include <AL2HMIBridge/HMI2ALMessageSender>
 #include <AL2HMIBridge/HMI2NAVMessageSender>
@@ -33,10 +34,8 @@
 #include <HmiStateMachine/HmiState>
 
 #include <QDir>
-#include <QFileInfo>
 #include <QQmlContext>
 #include <QQmlEngine>
-#include <QSettings>
 #include <QSortFilterProxyModel>
 
 #include <utility>
@@ -46,26 +45,6 @@ using HmiGuiFramework::DataStore;
 namespace HmiCore {
 
 namespace {
-
-/// Which module plugins may be loaded, from plugins.conf.
-struct PluginLists
-{
-    QStringList whitelist;
-    QStringList blacklist;
-
-    // The white list only rescues names from the black list: an empty one restricts nothing.
-    bool allow(const QString& name) const { return whitelist.contains(name) || !blacklist.contains(name); }
-};
-
-PluginLists readPluginLists(const QString& fileName)
-{
-    if (!QFileInfo(fileName).isFile()) // reading a pipe of this name would never end
-        return {};
-    QSettings settings(fileName, QSettings::IniFormat);
-    settings.beginGroup(QStringLiteral("Global"));
-    return {settings.value(QStringLiteral("whitelist")).toStringList(),
-            settings.value(QStringLiteral("blacklist")).toStringList()};
-}
 
 QDir baseDir()
 {
@@ -273,7 +252,7 @@ void HmiApplication::loadModulePlugins()
 
     QDir settings = baseDir();
     settings.cd(QStringLiteral("settings"));
-    const PluginLists lists = readPluginLists(settings.absoluteFilePath(QStringLiteral("plugins.conf")));
+    const PluginLists lists = PluginLists::read(settings.absoluteFilePath(QStringLiteral("plugins.conf")));
 
     const QStringList fileNames = filesIn(directory);
     for (const QString& fileName : fileNames) {
