@@ -2,6 +2,7 @@
 #include "bridgetester.h"
 
 #include "callsender.h"
+#include "channelreader.h"
 #include "decoder.h"
 #include "refusals.h"
 
@@ -48,6 +49,45 @@ QString BridgeTester::Call::text() const
         texts.append(isText ? QLatin1Char('"') + argument.toString() + QLatin1Char('"') : argument.toString());
     }
     return QStringLiteral("%1.%2(%3)").arg(source, name, texts.join(QStringLiteral(", ")));
+}
+
+BridgeTester::Peer::Peer(BridgeEndpoint::Channel channel)
+    : m_channel(channel)
+    , m_reader(std::make_unique<ChannelReader>(channel))
+{
+}
+
+BridgeTester::Peer::~Peer()
+{
+    if (!m_reader)
+        return;
+    m_reader->finish();
+    disconnect();
+}
+
+bool BridgeTester::Peer::send(const QByteArray& bytes)
+{
+    if (!m_reader)
+        return false;
+    std::vector<Message> messages;
+    const bool spoken = m_reader->feed(bytes.constData(), int(bytes.size()), &messages);
+    for (Message& message : messages)
+        deliver(message);
+    if (!spoken)
+        disconnect();
+    return spoken;
+}
+
+void BridgeTester::Peer::disconnect()
+{
+    const bool announced = m_reader->greeted();
+    m_reader.reset();
+    if (!announced)
+        return;
+    Message message;
+    message.kind = Message::Disconnected;
+    message.channel = m_channel;
+    deliver(message);
 }
 
 BridgeTester::BridgeTester()

@@ -2,6 +2,7 @@
 #include "logcapture.h"
 
 #include <AL2HMIBridge/AMTunerSource>
+#include <AL2HMIBridge/BridgeConnection>
 #include <AL2HMIBridge/BridgeTester>
 #include <AL2HMIBridge/FMTunerSource>
 #include <AL2HMIBridge/GlobalSource>
@@ -96,6 +97,47 @@ private Q_SLOTS:
         QVERIFY(HMI2ALMessageSender::instance()->send(QStringLiteral("Any"), QStringLiteral("thing"),
                                                       {1, QStringLiteral("a")}));
         QCOMPARE(BridgeTester::takeCalls(), QStringList({QStringLiteral("Any.thing(1, \"a\")")}));
+    }
+
+    void aPeerSpeaksInAnyPieces()
+    {
+        const BridgeTester tester;
+        BridgeTester::Peer peer(BridgeEndpoint::Messages);
+        QVERIFY(peer.send("{\"protocol\":1,\"peer\":\"applic"));
+        QVERIFY(!BridgeConnection::instance()->connected());
+        QVERIFY(peer.send("ation-layer\"}\n{\"source\":\"GlobalSource\",\"state\":{\"volume\":7}}\n{\"snap"));
+        QVERIFY(BridgeConnection::instance()->connected());
+        QCOMPARE(GlobalSource::instance()->volume(), 0); // until the snapshot is whole
+        QVERIFY(peer.send("shot\":\"complete\"}\n"));
+        QCOMPARE(GlobalSource::instance()->volume(), 7);
+        QVERIFY(BridgeConnection::instance()->synchronised());
+    }
+
+    void aPeerThatHangsUpLeavesItsState()
+    {
+        const BridgeTester tester;
+        {
+            BridgeTester::Peer peer(BridgeEndpoint::Messages);
+            QVERIFY(peer.send("{\"protocol\":1,\"peer\":\"application-layer\"}\n{\"snapshot\":\"complete\"}\n"));
+            QVERIFY(peer.send("{\"source\":\"GlobalSource\",\"state\":{\"volume\":7}}\n{\"source\""));
+        }
+        QVERIFY(m_log->takeOne(QtWarningMsg,
+                               QStringLiteral("Line refused on messages: the peer hung up in the middle of a line")));
+        QCOMPARE(GlobalSource::instance()->volume(), 7);
+        QVERIFY(!BridgeConnection::instance()->connected());
+        QVERIFY(!BridgeConnection::instance()->synchronised());
+    }
+
+    void aPeerThatDoesNotGreetIsHungUpOn()
+    {
+        const BridgeTester tester;
+        BridgeTester::Peer peer(BridgeEndpoint::Priority);
+        QVERIFY(!peer.send("{\"source\":\"KeySource\",\"event\":\"keyEvent\",\"args\":[7,0]}\n"));
+        QVERIFY(m_log->takeOne(
+            QtWarningMsg,
+            QStringLiteral("Line refused on priority: no greeting: the first line must tell the protocol version")));
+        QVERIFY(!peer.send("{\"protocol\":1,\"peer\":\"application-layer\"}\n"));
+        QVERIFY(!BridgeConnection::instance()->channelConnected(BridgeEndpoint::Priority));
     }
 };
 

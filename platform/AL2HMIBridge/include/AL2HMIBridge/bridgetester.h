@@ -2,6 +2,7 @@
 #pragma once
 
 #include "al2hmibridge_export.h"
+#include "bridgeendpoint.h"
 
 #include <QList>
 #include <QString>
@@ -10,9 +11,12 @@
 #include <QVariantMap>
 
 #include <initializer_list>
+#include <memory>
 #include <utility>
 
 namespace AL2HMIBridge {
+
+class ChannelReader;
 
 /// \brief Plays the application layer in a test, without threads and sockets. GUI thread only; one at a time.
 ///
@@ -31,6 +35,30 @@ public:
 
         /// \brief Such as `GlobalSource.setAudioSource(12, -1)` or `FMTunerSource.tune("98.5", "-1")`.
         QString text() const;
+    };
+
+    /// \brief The application layer at the other end of one channel, from connecting to hanging up.
+    ///
+    /// What it sends goes the way of what arrives on a socket: greeting, snapshot, lines in whatever pieces. A new one is what
+    /// a restarted application layer is.
+    class AL2HMIBRIDGE_EXPORT Peer
+    {
+    public:
+        /// \brief Connects.
+        explicit Peer(BridgeEndpoint::Channel channel);
+        /// \brief Hangs up, if the HMI has not.
+        ~Peer();
+        Peer(const Peer&) = delete;
+        Peer& operator=(const Peer&) = delete;
+
+        /// \brief Sends bytes; what they complete is with the sources when it returns. False once the HMI has hung up.
+        bool send(const QByteArray& bytes);
+
+    private:
+        void disconnect();
+
+        const BridgeEndpoint::Channel m_channel;
+        std::unique_ptr<ChannelReader> m_reader;
     };
 
     BridgeTester();
