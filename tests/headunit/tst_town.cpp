@@ -75,6 +75,10 @@ private Q_SLOTS:
             "streets[0].points[1]: is no pair of metres");
         row("a point of texts", streets(R"({"class": "main", "points": [["0", "0"], [1, 1]]})").constData(),
             "streets[0].points[0]: is no pair of metres");
+        row("a point beyond whole numbers", streets(R"({"class": "main", "points": [[0, 0], [1, 1e36]]})").constData(),
+            "streets[0].points[1]: is too far away");
+        row("a start beyond all bounds", R"({"start": {"at": [-10000001, 0]}, "streets": []})",
+            "start.at: is too far away");
     }
 
     void whatIsWrongIsNamed()

@@ -7,7 +7,11 @@
 #include <QJsonDocument>
 #include <QJsonObject>
 
+#include <cmath>
+
 namespace {
+
+constexpr double farthest = 1e7; ///< metres from the corner; more than any town, and what a whole number holds
 
 /// Reads the fields of a town and remembers the first that is wrong.
 class TownReader
@@ -76,7 +80,10 @@ private:
         const QJsonArray pair = value.toArray();
         if (pair.size() != 2 || !pair.at(0).isDouble() || !pair.at(1).isDouble())
             fail(where, QStringLiteral("is no pair of metres"));
-        return {pair.at(0).toDouble(), pair.at(1).toDouble()};
+        const QPointF point(pair.at(0).toDouble(), pair.at(1).toDouble());
+        if (!(std::abs(point.x()) <= farthest && std::abs(point.y()) <= farthest))
+            fail(where, QStringLiteral("is too far away"));
+        return point;
     }
 
     QPolygonF points(const QJsonObject& object, const QString& where, int fewest)
