@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "expectedkeycalls.h"
 #include "keyjournal.h"
+#include "keyworldshown.h"
 #include "logcapture.h"
 
 #include <QTest>
@@ -58,65 +59,9 @@ class HardKeyProductTest : public QObject
     std::optional<KeyJournal> journal;
     KeyWorld shown; // what the sources say
 
-    static void setTuners(const KeyWorld& world, const KeyWorld& before)
-    {
-        const char* const names[] = {"AMTunerSource", "FMTunerSource", "XMTunerSource", "DABTunerSource"};
-        for (size_t i = 0; i < world.tuners.size(); ++i) {
-            const KeyWorld::Tuner& tuner = world.tuners[i];
-            const KeyWorld::Tuner& old = before.tuners[i];
-            if (std::tie(tuner.autoStoreInProgress, tuner.announcementType, tuner.trafficAnnouncementEnabled,
-                         tuner.activePreset, tuner.activePresetBank)
-                == std::tie(old.autoStoreInProgress, old.announcementType, old.trafficAnnouncementEnabled,
-                            old.activePreset, old.activePresetBank))
-                continue;
-            QVERIFY(
-                BridgeTester::setState(names[i], {{"autoStoreInProgress", tuner.autoStoreInProgress != 0},
-                                                  {"announcementType", tuner.announcementType},
-                                                  {"trafficAnnouncementEnabled", tuner.trafficAnnouncementEnabled != 0},
-                                                  {"activePreset", tuner.activePreset},
-                                                  {"activePresetBank", tuner.activePresetBank}}));
-        }
-    }
-
     void show(const KeyWorld& world)
     {
-        struct Field
-        {
-            int KeyWorld::*value;
-            const char* source;
-            const char* name;
-            bool isSwitch;
-        };
-        static const Field fields[] = {
-            {&KeyWorld::mainAudioSource, "GlobalSource", "mainAudioSource", false},
-            {&KeyWorld::hdSignalLoss, "FMTunerSource", "hdSignalLossStatus", false},
-            {&KeyWorld::replay, "XMTunerSource", "replayStatus", false},
-            {&KeyWorld::satellitePlays, "XMTunerSource", "playStatus", false},
-            {&KeyWorld::cdStatus, "CDSource", "cdStatus", false},
-            {&KeyWorld::projectionMode, "ProjectionSource", "projectionMode", false},
-            {&KeyWorld::projectedCall, "ProjectionSource", "dioCallStatus", false},
-            {&KeyWorld::eventsBlocked, "EAPhoneSource", "eventsBlocked", true},
-            {&KeyWorld::incomingCall, "PhoneSource", "incomingCall", true},
-            {&KeyWorld::callConnected, "PhoneSource", "callConnected", true},
-            {&KeyWorld::privateMode, "PhoneSource", "privateMode", true},
-            {&KeyWorld::siriSupported, "PhoneSource", "siriSupported", true},
-            {&KeyWorld::siriEnabled, "PhoneSource", "siriEnabled", true},
-            {&KeyWorld::siriActive, "PhoneSource", "siriActive", true},
-            {&KeyWorld::phoneVoiceService, "PhoneSource", "phoneVoiceServiceActive", true},
-            {&KeyWorld::voiceSession, "SpeechSource", "sessionState", false},
-            {&KeyWorld::spokenText, "SpeechSource", "ttsSessionActive", true},
-            {&KeyWorld::recogniserReady, "SpeechSource", "voiceRecognitionEngineReady", true},
-            {&KeyWorld::valetMode, "ValetModeSource", "valetModeEnabled", true},
-            {&KeyWorld::diagnostics, "BezelDiagnosticsSource", "bezelDiagnosticsActive", true},
-        };
-        for (const Field& field : fields) {
-            const int value = world.*field.value;
-            if (value == shown.*field.value)
-                continue;
-            QVERIFY(BridgeTester::setState(field.source,
-                                           {{field.name, field.isSwitch ? QVariant(value != 0) : QVariant(value)}}));
-        }
-        setTuners(world, shown);
+        QVERIFY(showKeyWorld(world, shown));
         shown = world;
     }
 
