@@ -9,6 +9,7 @@ endif()
 set(HMI_QT 5 CACHE STRING "Major version of Qt: 5 or 6")
 set_property(CACHE HMI_QT PROPERTY STRINGS 5 6)
 option(HMI_BENCHMARKS "Build the benchmarks" OFF)
+option(HMI_FUZZ "Build the fuzzers; needs Clang" OFF)
 option(HMI_QML_PRIVATE "Let the QML loggers use Qt's private object model (fast); otherwise the public API" ON)
 
 find_package(ECM 5.100 REQUIRED NO_MODULE)
@@ -46,8 +47,11 @@ add_compile_definitions(
     QT_NO_CAST_FROM_ASCII QT_NO_CAST_TO_ASCII QT_NO_CAST_FROM_BYTEARRAY QT_NO_URL_CAST_FROM_STRING
     QT_NO_KEYWORDS QT_NO_FOREACH QT_NO_NARROWING_CONVERSIONS_IN_CONNECT QT_STRICT_ITERATORS
     QT_MESSAGELOGCONTEXT)
-add_compile_options(-Wall -Wextra -Wpedantic -Wshadow=local -Wnon-virtual-dtor -Woverloaded-virtual -Wcast-qual
-    -Wformat-security -Wundef)
+add_compile_options(-Wall -Wextra -Wpedantic $<$<CXX_COMPILER_ID:GNU>:-Wshadow=local> -Wnon-virtual-dtor
+    -Woverloaded-virtual -Wcast-qual -Wformat-security -Wundef)
+if(CMAKE_CXX_COMPILER_ID STREQUAL "Clang")
+    add_compile_options(-Wno-gnu-zero-variadic-macro-arguments) # Qt's logging macros, streamed into
+endif()
 if(CMAKE_CXX_COMPILER_ID STREQUAL "GNU" AND CMAKE_CXX_COMPILER_VERSION VERSION_LESS 13)
     add_compile_options(-Wno-stringop-overflow) # taken in by QVector's moving of elements when it optimises
 endif()
