@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "pluginfile.h"
 
+#include "elfsections.h"
+
 #include <QDir>
 #include <QJsonArray>
 
@@ -8,9 +10,12 @@ namespace HmiCore {
 
 PluginFile::PluginFile(const QDir& directory, const QString& fileName)
     : m_fileName(fileName)
-    , m_loader(directory.absoluteFilePath(fileName))
-    , m_metaData(m_loader.metaData())
 {
+    const QString path = directory.absoluteFilePath(fileName);
+    if (!hasSoundSections(path))
+        return;
+    m_loader.setFileName(path);
+    m_metaData = m_loader.metaData();
 }
 
 bool PluginFile::hasInterfaceId(const char* interfaceId) const

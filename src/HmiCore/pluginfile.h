@@ -14,7 +14,7 @@ namespace HmiCore {
 
 /// \brief A file in a plugin directory, which may or may not be a plugin.
 ///
-/// Reading the metadata does not load the library. A library that was loaded stays loaded when this object goes.
+/// Reading the metadata does not load the library; what is damaged has none. A library that was loaded stays loaded when this object goes.
 class PluginFile
 {
 public:
@@ -44,7 +44,7 @@ private:
 
     const QString m_fileName;
     QPluginLoader m_loader;
-    const QJsonObject m_metaData;
+    QJsonObject m_metaData; ///< empty when the file is no plugin or damaged
 };
 
 } // namespace HmiCore
