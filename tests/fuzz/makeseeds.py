@@ -153,6 +153,11 @@ def bridge():
             lines.append((way, {"source": source["name"], "event": event["name"], "args": arguments}))
     for record in table["records"]:
         words |= {field["name"] for field in record["fields"]}
+    wrong = [1 << 31, 0.5, "x" * 65, True, None, [0.5], [{}], -3]
+    for source in table["sources"]:
+        for item in {item["type"]: item for item in source.get("state", [])}.values():
+            for value in wrong:
+                lines.append((b"", {"source": source["name"], "state": {item["name"]: value}}))
     encoded = [(way, json.dumps(line, ensure_ascii=False, separators=(",", ":")).encode()) for way, line in lines]
     encoded.append((b"", b'{"protocol":1,"peer":"application-layer"}'))
     encoded.append((b"", b'{"snapshot":"complete"}'))
@@ -177,6 +182,7 @@ def intents():
         return bytes([6, intent, kind])
     performing, refusing, dying, killing, changing = 0, 1, 3, 5, 6
     write("intents", "newest-first", add(1, [0, 1], performing) + add(2, [0], refusing) + request(0, 0) + request(0, 1) + request(1, 3))
+    write("intents", "until-one-does", add(1, [0], performing) + add(2, [0], performing) + request(0, 1) + request(0, 0))
     write("intents", "nobody", request(3, 0) + add(1, [0], refusing) + request(0, 2) + bytes([2, 1]) + request(0, 0))
     write("intents", "dies-when-asked", add(1, [0], performing) + add(2, [0], dying) + request(0, 0) + request(0, 0))
     write("intents", "kills-the-next", add(1, [0], performing) + add(2, [0], killing, 1) + request(0, 0))
@@ -184,17 +190,36 @@ def intents():
     write("intents", "registered-twice", add(1, [2, 2], refusing) + bytes([3, 1]) + request(2, 0))
 
 
+def strokes():
+    """Sizes and points as strokes.cpp reads them; a pad of 100 by 100."""
+    half = lambda value: bytes([3, value])
+    point = lambda x, y: bytes([5, *half(2 * x), *half(2 * y)])
+    stroke = lambda *points: bytes([1, len(points)]) + b"".join(points)
+    pad = half(200) + half(200)
+    write("strokes", "steps-of-two", pad + stroke(point(1, 1), point(2, 1), point(3, 1), point(3, 2), point(4, 3), point(9, 9)))
+    write("strokes", "other-sides", half(100) + half(50) + stroke(point(1, 1), point(7, 3), point(7, 4)) + stroke())
+
+
 def keys():
     """Steps as keys.cpp reads them: changes of the world and presses of keys."""
     def press(key, state):
         return bytes([5, 0, key, state])
-    pressed = [press(key, state) for key in (6, 7, 8, 10, 12, 22, 35, 41, 47, 54, 55, 60, 77, 83, 88, 89, 90) for state in (0, 2, 3, 4)]
-    sources = [bytes([0, 0, source]) for source in range(7)]
-    for number, source in enumerate(sources):
-        write("keys", f"source-{number}", source + b"".join(pressed[number::2]))
-    projection = bytes([0, 2, 3, 2])
-    blocked = bytes([0, 1, 0, 1])
-    write("keys", "projection", projection + b"".join(pressed[::3]) + blocked + b"".join(pressed[1::3]))
+    everything = b"".join(press(key, state) for key in range(100) for state in range(6))
+    source = lambda number: bytes([0, 0, number])
+    number = lambda which, value: bytes([0, 2, which, value])
+    switch = lambda which: bytes([0, 1, which, 1])
+    tuner = lambda which, *values: bytes([0, 4, which, *values])
+    lost_signal, replay, projection = number(0, 1), number(1, 1), number(3, 2)
+    for which in range(7):
+        write("keys", f"source-{which}", source(which) + everything)
+        write("keys", f"projection-{which}", source(which) + projection + everything)
+    write("keys", "lost-signal", source(1) + lost_signal + everything)
+    write("keys", "replay", source(2) + replay + everything)
+    for which in range(12):
+        write("keys", f"switch-{which}", switch(which) + everything + projection + everything)
+    for which in range(4):
+        write("keys", f"tuner-{which}", source(which) + tuner(which, 1, 1, 2, 7, 1) + everything)
+    write("keys", "voices", number(5, 2) + switch(8) + everything + switch(4) + switch(5) + switch(6) + everything)
     write("keys", "bystander", bytes([4, 1]) + press(60, 2) + bytes([4, 0, 4, 0]) + press(60, 2))
     write("keys", "combinations", bytes([3, 7, 5, 3, 7, 4, 3, 8, 5]))
 
@@ -205,5 +230,6 @@ descriptors()
 dictionaries()
 bridge()
 intents()
+strokes()
 keys()
 (out / "made").touch()
