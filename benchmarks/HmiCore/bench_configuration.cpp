@@ -144,7 +144,6 @@ void measureLoading()
             benchmark::DoNotOptimize(into);
         }
     });
-    std::printf("(the property file has %d kB)\n", int(large.size() / 1000));
 }
 
 /// A catalogue of texts as a module has them.

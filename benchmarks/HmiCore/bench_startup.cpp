@@ -42,9 +42,9 @@ double measured(const QString& program, const QString& argument)
     return process.readAllStandardOutput().trimmed().toDouble();
 }
 
-/// Medians of two programs that run in turns, so that a busy machine slows both.
-std::pair<double, double> compared(const QString& first, const QString& firstArgument, const QString& second,
-                                   const QString& secondArgument)
+/// Two programs that run in turns, so that a busy machine slows both.
+std::pair<Samples, Samples> compared(const QString& first, const QString& firstArgument, const QString& second,
+                                     const QString& secondArgument)
 {
     std::vector<double> firstTimes;
     std::vector<double> secondTimes;
@@ -52,7 +52,7 @@ std::pair<double, double> compared(const QString& first, const QString& firstArg
         firstTimes.push_back(measured(first, firstArgument));
         secondTimes.push_back(measured(second, secondArgument));
     }
-    return {Table::median(firstTimes), Table::median(secondTimes)};
+    return {firstTimes, secondTimes};
 }
 
 } // namespace
@@ -74,7 +74,6 @@ int main(int argc, char** argv)
     const QString hmi = base.filePath(QStringLiteral("bin/hmi"));
     copy(QStringLiteral(HMI), hmi);
 
-    Table::header();
     int present = 0;
     for (const int modules : {3, 50, 200}) {
         for (; present < modules; ++present)
@@ -87,7 +86,7 @@ int main(int argc, char** argv)
         } else {
             std::snprintf(operation, sizeof operation, "start to first screen, %d modules / bare window + dlopen",
                           modules);
-            Table::row(operation, whole, bare + byHand);
+            Table::row(operation, whole, bare.scaled(1, byHand.median()));
         }
         std::snprintf(operation, sizeof operation, "loading %d plugins / metadata, dlopen and instance", modules);
         Table::row(operation, loading, byHand, 1.3);

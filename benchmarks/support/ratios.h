@@ -5,7 +5,6 @@
 
 #include <benchmark/benchmark.h>
 
-#include <algorithm>
 #include <map>
 #include <string>
 #include <vector>
@@ -24,19 +23,13 @@ public:
                                                               / benchmark::GetTimeUnitMultiplier(run.time_unit) * 1e6);
     }
 
-    /// The median of all repetitions, in microseconds.
-    double median(const char* name) const { return Table::median(m_times.at(name)); }
+    Samples samples(const char* name) const { return m_times.at(name); }
 
-    /// \a ours against \a limit, the time of each divided by how many operations it stands for.
-    void row(const char* operation, const char* ours, const char* limit, double aim, double oursCount = 1) const
+    /// \a ours against \a limit. \a oursCount tells for how many operations one of ours stands.
+    void row(const char* operation, const char* ours, const char* limit, std::optional<double> aim = {},
+             double oursCount = 1) const
     {
-        Table::row(operation, median(ours) / oursCount, median(limit), aim);
-    }
-
-    /// For information only.
-    void row(const char* operation, const char* ours, const char* limit) const
-    {
-        Table::row(operation, median(ours), median(limit));
+        Table::row(operation, samples(ours).scaled(1 / oursCount), samples(limit), aim);
     }
 
     /// Repetitions of the benchmarks take turns, so that a slow moment of the machine meets all of them.

@@ -75,6 +75,12 @@ CommandLine CommandLine::parse(const QStringList& arguments)
     const QCommandLineOption pictures(
         QStringLiteral("pictures"), QStringLiteral("Draw the tour without a display, and write its pictures to <dir>."),
         QStringLiteral("dir"));
+    const QCommandLineOption startupReport(
+        QStringLiteral("startup-report"),
+        QStringLiteral(
+            "Start, tell what took how long until the first frame, draw that into <file> (SVG) and into a trace "
+            "beside it (.json), and exit."),
+        QStringLiteral("file"));
     const QCommandLineOption country(
         QStringLiteral("country"),
         QStringLiteral("Country of the built-in vehicle, as markets/config.json writes it, such as 114 for Germany."),
@@ -86,7 +92,8 @@ CommandLine CommandLine::parse(const QStringList& arguments)
 
     QCommandLineParser parser;
     parser.setApplicationDescription(QStringLiteral("The reference head unit."));
-    parser.addOptions({vehicle, shot, view, size, night, listViews, tour, pictures, record, country, language, help});
+    parser.addOptions(
+        {vehicle, shot, view, size, night, listViews, tour, pictures, startupReport, record, country, language, help});
     if (!parser.parse(arguments))
         return wrong(parser.errorText());
     if (!parser.positionalArguments().isEmpty())
@@ -108,6 +115,12 @@ CommandLine CommandLine::parse(const QStringList& arguments)
     }
     if (parser.isSet(shot) && parser.value(shot).isEmpty())
         return wrong(QStringLiteral("--shot needs the name of a file."));
+    line.startupReport = parser.value(startupReport);
+    if (parser.isSet(startupReport)
+        && (!line.startupReport.endsWith(QLatin1String(".svg")) || parser.isSet(shot) || parser.isSet(tour)
+            || parser.isSet(view)))
+        return wrong(
+            QStringLiteral("--startup-report needs a file that ends in .svg, and shows the start screen only."));
     line.tourFile = parser.value(tour);
     line.pictures = parser.value(pictures);
     if (!line.tourFile.isEmpty() && parser.isSet(vehicle))

@@ -21,6 +21,7 @@ struct CommandLine
     QString view;             ///< view or popup to show, empty for the start screen
     QString tourFile;         ///< empty for no tour
     QString pictures;         ///< folder for the pictures of the tour, empty for none
+    QString startupReport;    ///< picture of the start-up, after which the head unit ends; empty for none
     QString recordFile;       ///< empty for no recording
     QSize size{1280, 720};
     int country = -1;  ///< that the built-in vehicle is made for, -1 for its own

@@ -4,6 +4,8 @@
 #include "productinitializer.h"
 #include "screenshot.h"
 #include "settings.h"
+#include "startupformats.h"
+#include "startupreport.h"
 #include "tour.h"
 #include "vehiclekeys.h"
 
@@ -20,6 +22,8 @@
 #include <HmiVehicle/embeddedvehicle.h>
 
 #include <QTextStream>
+
+#include <optional>
 
 using AL2HMIBridge::BridgeEndpoint;
 using AL2HMIBridge::BridgeRecorder;
@@ -107,10 +111,30 @@ void lead(HmiApplication& application, const CommandLine& commandLine, const Tou
     tour->start();
 }
 
-int run(HmiApplication& application, const CommandLine& commandLine)
+/// Writes the report when the first frame is there, and ends.
+void writeReport(StartupReport& report, const QString& file)
+{
+    report.attachWindow();
+    QObject::connect(&report, &StartupReport::complete, QCoreApplication::instance(), [&report, file] {
+        QString error;
+        const bool isWritten = StartupReport::write(report.timeline(), file, &error);
+        if (isWritten)
+            QTextStream(stdout) << StartupFormats::table(report.timeline()) << file << '\n'
+                                << StartupReport::traceFile(file) << '\n';
+        else
+            QTextStream(stderr) << "headunit: " << error << '\n';
+        QCoreApplication::exit(isWritten ? 0 : cannotRun);
+    });
+}
+
+int run(HmiApplication& application, const CommandLine& commandLine, StartupReport* report)
 {
     ProductInitializer initializer(commandLine.night);
+    if (report)
+        report->attachModules();
     application.initialize(&initializer);
+    if (report)
+        writeReport(*report, commandLine.startupReport);
     if (commandLine.listViews)
         return listViews();
     TourFile tour;
@@ -153,6 +177,9 @@ int main(int argc, char** argv)
     }
 
     const HmiLogging::MessageHandler messageHandler(QStringLiteral("HMI"));
+    std::optional<StartupReport> report;
+    if (!commandLine.startupReport.isEmpty())
+        report.emplace();
     const bool headless = !commandLine.shotFile.isEmpty() || !commandLine.pictures.isEmpty() || commandLine.listViews;
     if (headless)
         drawOffScreen();
@@ -170,6 +197,6 @@ int main(int argc, char** argv)
 
     HmiApplication application(argc, argv);
     applySettings(commandLine.size);
-    AppSettings::instance()->setAnimations(!headless);
-    return run(application, commandLine);
+    AppSettings::instance()->setAnimations(!headless && !report);
+    return run(application, commandLine, report ? &*report : nullptr);
 }
