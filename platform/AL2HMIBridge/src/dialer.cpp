@@ -23,7 +23,9 @@ FileDescriptor openOwnDirectory(const QString& path, QString* problem)
     FileDescriptor directory(
         ::open(QFile::encodeName(path).constData(), O_PATH | O_DIRECTORY | O_NOFOLLOW | O_CLOEXEC));
     if (!directory.isValid()) {
-        if (errno != ENOENT)
+        if (errno == EMFILE || errno == ENFILE)
+            *problem = QStringLiteral("the process has no descriptor left");
+        else if (errno != ENOENT)
             *problem = QStringLiteral("it is not a directory that can be opened");
         return directory;
     }

@@ -32,8 +32,11 @@ Outbox::Result Outbox::send(const QByteArray& line)
     m_waiting.append(line);
     if (first)
         write(m_waiting.constData(), int(m_waiting.size()));
-    if (m_broken)
+    if (m_broken) {
+        m_waiting.clear(); // told by what is returned, and not once more at the end
+        m_waker.wake();
         return NoPeer;
+    }
     if (first && !m_waiting.isEmpty())
         m_waker.wake();
     return Sent;
@@ -83,7 +86,7 @@ void Outbox::write(const char* data, int size)
         else if (errno == EAGAIN || errno == EWOULDBLOCK)
             break;
         else if (errno != EINTR)
-            m_broken = true; // the reading side finds out and hangs up
+            m_broken = true; // the receive loop hangs up, once it has read what is left
     }
     m_waiting.remove(0, sent);
 }
@@ -92,6 +95,12 @@ bool Outbox::wantsToWrite() const
 {
     const std::lock_guard<std::mutex> lock(m_mutex);
     return !m_waiting.isEmpty() && !m_broken;
+}
+
+bool Outbox::isBroken() const
+{
+    const std::lock_guard<std::mutex> lock(m_mutex);
+    return m_broken;
 }
 
 int Outbox::socket() const

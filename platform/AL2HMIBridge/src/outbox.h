@@ -30,6 +30,8 @@ public:
     /// Sends what waits, as far as the socket takes it.
     void flush();
     bool wantsToWrite() const;
+    /// The peer takes nothing any more, though it may still send.
+    bool isBroken() const;
 
     int socket() const;
     Waker& waker() { return m_waker; }

@@ -113,6 +113,8 @@ bool ReceiveLoop::serve(FileDescriptor opened)
             m_outbox.flush();
         if (reading && descriptors[1].revents && !receive(descriptors[1].fd, reader))
             return reader.greeted();
+        if (reading && !(descriptors[1].revents & (POLLIN | POLLHUP)) && m_outbox.isBroken())
+            return reader.greeted();
         if (reader.greeted() && !link.announced) {
             link.announced = true;
             m_outbox.setReady();
