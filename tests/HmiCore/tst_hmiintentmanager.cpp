@@ -441,6 +441,35 @@ private Q_SLOTS:
         QCOMPARE(counter.plain, threadCount * requestsEach);
         QVERIFY(!counter.overlapped);
     }
+
+    /// Requests with sequence numbers, from several threads at once.
+    void noRequestIsLostDoubledOrReordered()
+    {
+        constexpr int threads = 4;
+        constexpr int requests = 25000;
+        const int intent = newIntent();
+        FakeHandler first(QStringLiteral("first"), {intent});
+        FakeHandler second(QStringLiteral("second"), {intent});
+        manager->registerIntentHandler(&first);
+        manager->registerIntentHandler(&second);
+        std::vector<std::unique_ptr<QThread>> requesters;
+        for (int thread = 0; thread < threads; ++thread) {
+            requesters.emplace_back(QThread::create([this, intent, thread] {
+                for (int number = 0; number < requests; ++number)
+                    manager->requestAction(intent, {thread, number});
+            }));
+            requesters.back()->start();
+        }
+        for (const auto& requester : requesters)
+            QVERIFY(requester->wait(60000));
+
+        for (const FakeHandler* const handler : {&first, &second}) {
+            QCOMPARE(handler->requests.size(), threads * requests);
+            int next[threads] = {};
+            for (const FakeHandler::Request& request : handler->requests)
+                QCOMPARE(request.data[1].toInt(), next[request.data[0].toInt()]++);
+        }
+    }
 };
 
 QTEST_GUILESS_MAIN(HmiIntentManagerTest)
