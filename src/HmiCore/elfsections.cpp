@@ -3,9 +3,14 @@
 
 #include <QFile>
 
+#include <algorithm>
 #include <cstring>
 #include <elf.h>
+#include <fcntl.h>
 #include <link.h>
+#include <sys/stat.h>
+#include <unistd.h>
+#include <vector>
 
 namespace HmiCore {
 
@@ -17,22 +22,35 @@ using Section = ElfW(Shdr);
 constexpr uchar ownClass = sizeof(void*) == 8 ? ELFCLASS64 : ELFCLASS32;
 constexpr uchar ownOrder = Q_BYTE_ORDER == Q_LITTLE_ENDIAN ? ELFDATA2LSB : ELFDATA2MSB;
 
-struct Bytes
+/// Read in the few places that count: mapping it would take as long as the rest of the scan.
+class File
 {
-    const uchar* begin;
-    quint64 size;
+public:
+    explicit File(const QString& path)
+        : m_descriptor(::open(QFile::encodeName(path).constData(), O_RDONLY | O_CLOEXEC))
+    {
+        struct stat status;
+        if (m_descriptor >= 0 && ::fstat(m_descriptor, &status) == 0)
+            m_size = quint64(status.st_size);
+    }
+    ~File()
+    {
+        if (m_descriptor >= 0)
+            ::close(m_descriptor);
+    }
+    Q_DISABLE_COPY(File)
 
-    bool has(quint64 offset, quint64 count) const { return count <= size && offset <= size - count; }
+    bool has(quint64 offset, quint64 count) const { return count <= m_size && offset <= m_size - count; }
     bool has(const Section& section) const { return has(section.sh_offset, section.sh_size); }
 
-    /// It may be unaligned in a damaged file.
-    template <typename T>
-    T at(quint64 offset) const
+    bool read(quint64 offset, void* target, quint64 count) const
     {
-        T value;
-        std::memcpy(&value, begin + offset, sizeof value);
-        return value;
+        return has(offset, count) && ::pread(m_descriptor, target, count, off_t(offset)) == ssize_t(count);
     }
+
+private:
+    const int m_descriptor;
+    quint64 m_size = 0;
 };
 
 bool isForThisMachine(const Header& header)
@@ -41,45 +59,36 @@ bool isForThisMachine(const Header& header)
            && header.e_ident[EI_DATA] == ownOrder;
 }
 
-bool areNamesSound(const Bytes& file, const Section& names)
+bool areNamesSound(const File& file, const Section& names)
 {
-    return names.sh_size > 0 && file.has(names) && file.begin[names.sh_offset + names.sh_size - 1] == '\0';
+    char last = 0;
+    return names.sh_size > 0 && file.has(names) && file.read(names.sh_offset + names.sh_size - 1, &last, 1)
+           && last == '\0';
 }
 
-bool areSectionsSound(const Bytes& file)
+bool areSectionsSound(const File& file)
 {
-    if (!file.has(0, sizeof(Header)))
-        return false;
-    const auto header = file.at<Header>(0);
-    if (!isForThisMachine(header))
+    Header header;
+    if (!file.read(0, &header, sizeof header) || !isForThisMachine(header))
         return false;
     if (header.e_shnum == 0 && header.e_shoff == 0 && header.e_shstrndx == 0)
         return true; // there is no table
-    if (header.e_shentsize != sizeof(Section) || header.e_shstrndx >= header.e_shnum
-        || !file.has(header.e_shoff, quint64(header.e_shnum) * sizeof(Section)))
+    if (header.e_shentsize != sizeof(Section) || header.e_shstrndx >= header.e_shnum)
         return false;
-    const auto section = [&](quint64 index) { return file.at<Section>(header.e_shoff + index * sizeof(Section)); };
-    const Section names = section(header.e_shstrndx);
-    if (!areNamesSound(file, names))
+    std::vector<Section> sections(header.e_shnum);
+    if (!file.read(header.e_shoff, sections.data(), sections.size() * sizeof(Section)))
         return false;
-    for (quint64 index = 0; index < header.e_shnum; ++index) {
-        const Section one = section(index);
-        if (one.sh_name >= names.sh_size || (one.sh_type != SHT_NOBITS && !file.has(one)))
-            return false;
-    }
-    return true;
+    const Section& names = sections[header.e_shstrndx];
+    return areNamesSound(file, names) && std::all_of(sections.cbegin(), sections.cend(), [&](const Section& section) {
+               return section.sh_name < names.sh_size && (section.sh_type == SHT_NOBITS || file.has(section));
+           });
 }
 
 } // namespace
 
 bool hasSoundSections(const QString& path)
 {
-    QFile file(path);
-    if (!file.open(QIODevice::ReadOnly | QIODevice::Unbuffered))
-        return false;
-    const qint64 size = file.size();
-    const uchar* const content = size > 0 ? file.map(0, size) : nullptr;
-    return content && areSectionsSound({content, quint64(size)});
+    return areSectionsSound(File(path));
 }
 
 } // namespace HmiCore
