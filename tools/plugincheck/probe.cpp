@@ -2,6 +2,7 @@
 #include "probe.h"
 
 #include "elffile.h"
+#include "elfsections.h"
 #include "enginelanguages.h"
 #include "moduledescription.h"
 #include "probelog.h"
@@ -247,7 +248,9 @@ void runEventLoop(HmiApplication* application)
 
 void probe(HmiApplication* application, const QString& plugin)
 {
-    const Kind kind = tellMetaData(QPluginLoader(plugin).metaData());
+    // As the head unit, which does not let Qt look at what is damaged.
+    const bool isSound = HmiCore::hasSoundSections(plugin);
+    const Kind kind = tellMetaData(isSound ? QPluginLoader(plugin).metaData() : QJsonObject());
     if (kind == Kind::None || !load(plugin, kind))
         return;
 
