@@ -6,7 +6,8 @@ set(HMI_HEADUNIT_DIR ${CMAKE_INSTALL_LIBDIR}/headunit) # where it is installed: 
 
 # hmi_add_library(<name> SOURCES ... HEADERS ... [FORWARD Class A,B ...] [NAMESPACE ns] [PUBLIC ...] [PRIVATE ...]
 #                 [INCLUDE_DIR dir] [COMPONENT c])
-# A shared library with an export header, forwarding headers <name/Class>, soname 1 and an install rule.
+# A shared library with an export header, forwarding headers <name/Class>, soname 1 and install rules: what programs need to
+# run in the component <export>, what they need to be built in <export>Dev.
 # `A,B` makes forwarding headers A and B for a.h.
 function(hmi_add_library name)
     cmake_parse_arguments(ARG "" "NAMESPACE;INCLUDE_DIR;EXPORT" "SOURCES;HEADERS;FORWARD;PUBLIC;PRIVATE" ${ARGN})
@@ -29,21 +30,31 @@ function(hmi_add_library name)
     list(TRANSFORM ARG_HEADERS PREPEND ${CMAKE_CURRENT_SOURCE_DIR}/ REGEX "^[^/]" OUTPUT_VARIABLE all_headers)
     set_target_properties(${name} PROPERTIES VERSION ${PROJECT_VERSION} SOVERSION ${PROJECT_VERSION_MAJOR}
         HMI_HEADERS "${all_headers}")
-    install(TARGETS ${name} EXPORT ${ARG_EXPORT} COMPONENT ${ARG_EXPORT})
+    install(TARGETS ${name} EXPORT ${ARG_EXPORT}
+        LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR} COMPONENT ${ARG_EXPORT} NAMELINK_COMPONENT ${ARG_EXPORT}Dev)
     install(FILES ${forwarded} ${ARG_HEADERS} ${forwarding}/${lower}_export.h
-        DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}/${name} COMPONENT ${ARG_EXPORT})
+        DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}/${name} COMPONENT ${ARG_EXPORT}Dev)
 endfunction()
 
-# hmi_install_package(<name> NAMESPACE ns): installs the export set <name> and a package config made from <name>Config.cmake.in.
+# hmi_install_package(<name> NAMESPACE ns LIBRARIES ... REQUIRES ...): installs the export set <name>, a package config made from
+# <name>Config.cmake.in, and <name>.pc for pkg-config, with the libraries and the modules that it requires.
 function(hmi_install_package name)
-    cmake_parse_arguments(ARG "" "NAMESPACE" "" ${ARGN})
+    cmake_parse_arguments(ARG "" "NAMESPACE" "LIBRARIES;REQUIRES" ${ARGN})
     set(destination ${CMAKE_INSTALL_LIBDIR}/cmake/${name})
-    install(EXPORT ${name} FILE ${name}Targets.cmake NAMESPACE ${ARG_NAMESPACE}:: DESTINATION ${destination} COMPONENT ${name})
+    install(EXPORT ${name} FILE ${name}Targets.cmake NAMESPACE ${ARG_NAMESPACE}:: DESTINATION ${destination} COMPONENT ${name}Dev)
     configure_package_config_file(${name}Config.cmake.in ${CMAKE_CURRENT_BINARY_DIR}/${name}Config.cmake
         INSTALL_DESTINATION ${destination})
     write_basic_package_version_file(${CMAKE_CURRENT_BINARY_DIR}/${name}ConfigVersion.cmake COMPATIBILITY SameMajorVersion)
     install(FILES ${CMAKE_CURRENT_BINARY_DIR}/${name}Config.cmake ${CMAKE_CURRENT_BINARY_DIR}/${name}ConfigVersion.cmake
-        DESTINATION ${destination} COMPONENT ${name})
+        DESTINATION ${destination} COMPONENT ${name}Dev)
+
+    set(destination ${CMAKE_INSTALL_LIBDIR}/pkgconfig)
+    file(RELATIVE_PATH to_prefix /${destination} /)
+    list(TRANSFORM ARG_LIBRARIES PREPEND -l)
+    list(JOIN ARG_LIBRARIES " " libraries)
+    list(JOIN ARG_REQUIRES ", " requires)
+    configure_file(${PROJECT_SOURCE_DIR}/cmake/HmiPackage.pc.in ${CMAKE_CURRENT_BINARY_DIR}/${name}.pc @ONLY)
+    install(FILES ${CMAKE_CURRENT_BINARY_DIR}/${name}.pc DESTINATION ${destination} COMPONENT ${name}Dev)
 endfunction()
 
 # hmi_add_resources(<target> PREFIX /p FILES ...): compiles files into the target; on Qt 5 the QML ahead of time, for
@@ -81,7 +92,7 @@ function(hmi_add_test name)
     add_executable(${name} ${ARG_SOURCES})
     target_link_libraries(${name} PRIVATE HmiTestSupport Qt${QT_VERSION_MAJOR}::Test ${ARG_LINK})
     hmi_watch_threads(${name})
-    add_test(NAME ${name} COMMAND ${ARG_WRAPPER} $<TARGET_FILE:${name}>)
+    add_test(NAME ${name} COMMAND ${ARG_WRAPPER} ${CMAKE_CROSSCOMPILING_EMULATOR} $<TARGET_FILE:${name}>)
     set_tests_properties(${name} PROPERTIES TIMEOUT ${ARG_TIMEOUT}
         ENVIRONMENT "QT_QPA_PLATFORM=offscreen;QT_QUICK_BACKEND=software;LC_ALL=C.UTF-8;${HMI_TEST_ENVIRONMENT};${ARG_ENVIRONMENT}")
 endfunction()

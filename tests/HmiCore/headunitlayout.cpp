@@ -67,7 +67,9 @@ bool HeadUnitLayout::run(const QStringList& arguments)
     QProcess process;
     process.setProcessEnvironment(environment);
     process.setProcessChannelMode(QProcess::ForwardedErrorChannel);
-    process.start(m_program, arguments);
+    QStringList command = QStringLiteral(EMULATOR).split(QLatin1Char(';'), Qt::SkipEmptyParts);
+    command << m_program << arguments;
+    process.start(command.takeFirst(), command);
     if (!process.waitForFinished(60000)) {
         m_error = process.errorString();
         process.kill();
