@@ -10,6 +10,7 @@ set(HMI_QT 5 CACHE STRING "Major version of Qt: 5 or 6")
 set_property(CACHE HMI_QT PROPERTY STRINGS 5 6)
 option(HMI_BENCHMARKS "Build the benchmarks" OFF)
 option(HMI_FUZZ "Build the fuzzers; needs Clang" OFF)
+option(HMI_PACKAGES "Let CPack make Debian packages" OFF)
 option(HMI_QML_PRIVATE "Let the QML loggers use Qt's private object model (fast); otherwise the public API" ON)
 
 find_package(ECM 5.100 REQUIRED NO_MODULE)

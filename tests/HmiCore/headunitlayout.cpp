@@ -67,7 +67,7 @@ bool HeadUnitLayout::run(const QStringList& arguments)
     QProcess process;
     process.setProcessEnvironment(environment);
     process.setProcessChannelMode(QProcess::ForwardedErrorChannel);
-    QStringList command = QStringLiteral(EMULATOR).split(QLatin1Char(';'), Qt::SkipEmptyParts);
+    QStringList command = QStringLiteral(EMULATOR).split(QLatin1Char('|'), Qt::SkipEmptyParts);
     command << m_program << arguments;
     process.start(command.takeFirst(), command);
     if (!process.waitForFinished(60000)) {
