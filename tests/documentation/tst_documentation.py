@@ -13,7 +13,7 @@ import unittest
 
 DOCS = pathlib.Path(__file__).resolve().parents[2] / "docs"
 CMAKE = os.environ["HMI_CMAKE"]
-COMPONENTS = ("HmiPlatform", "HmiCore", "headunit")
+COMPONENTS = ("HmiPlatform", "HmiPlatformDev", "HmiCore", "HmiCoreDev", "headunit")
 DEADLINE = 600  # s
 TELL = 'performanceLogger.log("start screen, modules:", _modulesModel.rowCount())'
 START_SCREEN = "start screen, modules: "

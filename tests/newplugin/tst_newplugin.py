@@ -14,7 +14,7 @@ PROJECT = pathlib.Path(__file__).resolve().parents[2]
 BUILD = os.environ["HMI_BUILD"]
 CMAKE = os.environ["HMI_CMAKE"]
 CTEST = os.environ["HMI_CTEST"]
-COMPONENTS = ("HmiPlatform", "HmiCore", "headunit")
+COMPONENTS = ("HmiPlatform", "HmiPlatformDev", "HmiCore", "HmiCoreDev", "headunit")
 DEADLINE = 600  # s
 
 
