@@ -63,6 +63,13 @@ class Table:
     def cpp_type(self, item):
         return CPP_TYPES.get(item["type"], item["type"])
 
+    def qualified_type(self, item):
+        """As cpp_type(), with the whole name of an enumeration, which is what the meta-object system compares."""
+        kind = self.cpp_type(item)
+        owners = (source["name"] for source in self.sources if any(enum["name"] == kind for enum in source.get("enums", [])))
+        owner = next(owners, None)
+        return f"AL2HMIBridge::{owner}::{kind}" if owner else kind
+
 
 def literal(text):
     return json.dumps(text, ensure_ascii=False)
@@ -109,7 +116,7 @@ def lower_first(text):
 
 
 def parameter(table, argument):
-    kind = table.cpp_type(argument)
+    kind = table.qualified_type(argument)
     return f"const QString& {argument['name']}" if kind == "QString" else f"{kind} {argument['name']}"
 
 

@@ -71,7 +71,8 @@ void useEmbeddedVehicle(const CommandLine& commandLine, bool frozen)
 int listViews()
 {
     const auto descriptor = DataStore::get<ViewManager>(QStringLiteral("ViewManager"))->guiDescriptor();
-    QStringList names = descriptor.views.keys() + descriptor.popups.keys();
+    QStringList names = descriptor.views.keys();
+    names += descriptor.popups.keys();
     names.sort();
     QTextStream(stdout) << names.join(QLatin1Char('\n')) << '\n';
     return 0;

@@ -62,7 +62,8 @@ bool Screenshot::isKnown(const QString& view, QString* message)
     const auto descriptor = viewManager()->guiDescriptor();
     if (descriptor.popups.contains(view) || StateMachine::instance()->findState(view))
         return true;
-    QStringList known = descriptor.views.keys() + descriptor.popups.keys();
+    QStringList known = descriptor.views.keys();
+    known += descriptor.popups.keys();
     known.sort();
     *message =
         QStringLiteral("there is no view '%1'; there are: %2").arg(view.left(128), known.join(QStringLiteral(", ")));

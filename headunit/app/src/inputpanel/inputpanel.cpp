@@ -286,6 +286,14 @@ void InputPanel::addStroke(const QVariantList& points)
     m_written.addStroke(points);
 }
 
+void InputPanel::setViewLayer(QQuickItem* layer)
+{
+    if (layer == m_viewLayer)
+        return;
+    m_viewLayer = layer;
+    Q_EMIT viewLayerChanged();
+}
+
 void InputPanel::setHeight(double height)
 {
     if (height == m_height)

@@ -34,7 +34,7 @@ class InputPanel : public QObject
     Q_PROPERTY(int boxes READ boxes NOTIFY padChanged)
     Q_PROPERTY(double height READ height WRITE setHeight NOTIFY heightChanged)
     Q_PROPERTY(double lift READ lift NOTIFY heightChanged)
-    Q_PROPERTY(QQuickItem* viewLayer READ viewLayer WRITE setViewLayer)
+    Q_PROPERTY(QQuickItem* viewLayer READ viewLayer WRITE setViewLayer NOTIFY viewLayerChanged)
 
 public:
     enum Shift { Small, CapitalOnce, Capitals };
@@ -58,7 +58,7 @@ public:
     double lift() const; ///< pixels by which the view has to move up, so that the field is in sight
 
     QQuickItem* viewLayer() const { return m_viewLayer; } ///< what moves up
-    void setViewLayer(QQuickItem* layer) { m_viewLayer = layer; }
+    void setViewLayer(QQuickItem* layer);
     void setHeight(double height);
 
     Q_INVOKABLE void type(const QString& text);       ///< a key that types was pressed
@@ -77,6 +77,7 @@ Q_SIGNALS:
     void shiftChanged();
     void candidatesChanged();
     void heightChanged();
+    void viewLayerChanged();
     void padChanged();
     void padCleared(); ///< what is drawn is done with
     void handRested(); ///< what is drawn is taken for a whole character
