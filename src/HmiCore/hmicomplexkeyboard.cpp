@@ -9,7 +9,7 @@
 namespace HmiCore {
 
 namespace {
-FactoryRegistry<HmiComplexKeyboardEngineFactory> s_factories;
+Q_GLOBAL_STATIC(FactoryRegistry<HmiComplexKeyboardEngineFactory>, s_factories)
 }
 
 HmiComplexKeyboard::HmiComplexKeyboard(QObject* parent)
@@ -21,7 +21,7 @@ HmiComplexKeyboard::~HmiComplexKeyboard() = default;
 
 void HmiComplexKeyboard::registerFactory(int language, HmiComplexKeyboardEngineFactory* factory)
 {
-    s_factories.add(language, factory, "Complex keyboard factory registration failed, duplicated language.");
+    s_factories->add(language, factory, "Complex keyboard factory registration failed, duplicated language.");
 }
 
 HmiComplexKeyboardEngine* HmiComplexKeyboard::engine()
@@ -51,7 +51,7 @@ void HmiComplexKeyboard::updateEngine()
         m_engine->deleteLater();
     m_engine.clear();
 
-    if (HmiComplexKeyboardEngineFactory* const factory = s_factories.find(m_language)) {
+    if (HmiComplexKeyboardEngineFactory* const factory = s_factories->find(m_language)) {
         m_engine = factory->createEngine(this);
         if (!m_engine)
             qCWarning(coreLog) << Q_FUNC_INFO << "Engine creation failed.";

@@ -9,7 +9,7 @@
 namespace HmiCore {
 
 namespace {
-FactoryRegistry<HmiHandwritingRecognizerFactory> s_factories;
+Q_GLOBAL_STATIC(FactoryRegistry<HmiHandwritingRecognizerFactory>, s_factories)
 }
 
 HmiHandwriting::HmiHandwriting(QObject* parent)
@@ -25,7 +25,7 @@ HmiHandwriting::~HmiHandwriting()
 
 void HmiHandwriting::registerFactory(int language, HmiHandwritingRecognizerFactory* factory)
 {
-    s_factories.add(language, factory, "Handwriting recognizer factory registration failed, duplicated language.");
+    s_factories->add(language, factory, "Handwriting recognizer factory registration failed, duplicated language.");
 }
 
 HmiHandwritingRecognizer* HmiHandwriting::recognizer()
@@ -63,7 +63,7 @@ void HmiHandwriting::updateRecognizer()
         m_recognizer->deleteLater();
     m_recognizer.clear();
 
-    if (HmiHandwritingRecognizerFactory* const factory = s_factories.find(m_language)) {
+    if (HmiHandwritingRecognizerFactory* const factory = s_factories->find(m_language)) {
         m_recognizer = factory->createRecognizer(this);
         if (!m_recognizer)
             qCWarning(coreLog) << Q_FUNC_INFO << "Engine creation failed.";

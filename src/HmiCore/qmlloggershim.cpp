@@ -85,7 +85,8 @@ Place callerIn(const QString& stack)
     const int colon = int(caller.lastIndexOf(QLatin1Char(':')));
     if (at < 0 || colon < at)
         return {};
-    return {caller.mid(at + 1, colon - at - 1), caller.left(at), caller.mid(colon + 1).toInt()};
+    const QString line = caller.mid(colon + 1);
+    return {caller.mid(at + 1, colon - at - 1), caller.left(at), line.toInt()};
 }
 
 } // namespace

@@ -168,6 +168,8 @@ private Q_SLOTS:
             domains.append(change.at(0).toInt());
         QCOMPARE(domains, (QList<int>{5, 2, 9}));
         QCOMPARE(icons.size(), 0);
+        fake.activateIconOverride(4); // it is active already
+        QCOMPARE(icons.size(), 0);
         fake.syncIconOverrides();
         QCOMPARE(icons.size(), 1);
     }

@@ -9,6 +9,7 @@
 #include <QMetaMethod>
 #include <QPointF>
 #include <QPointer>
+#include <QQmlEngine>
 #include <QSignalSpy>
 #include <QTest>
 
@@ -147,6 +148,14 @@ private Q_SLOTS:
         engine.addInput(7);
         QCOMPARE(engine.currentInputString(), text("aa7"));
         QCOMPARE(engine.currentInput(), QVariantList({text("a"), text("a"), 7}));
+    }
+
+    void valuesOfQmlAreOpened()
+    {
+        QQmlEngine qml;
+        Engine engine;
+        engine.addInput(QVariant::fromValue(qml.evaluate(text("['n', 'i']"))));
+        QCOMPARE(engine.currentInput(), QVariantList({QVariantList({text("n"), text("i")})}));
     }
 
     void removingShortensTheTextOfSingleCharacters()

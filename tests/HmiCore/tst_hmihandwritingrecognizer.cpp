@@ -331,14 +331,20 @@ private Q_SLOTS:
         FakeRecognizer& engine = *owner;
         Done done(&engine);
         engine.addStrokes(stroke({{1, 1}}));
-        done.waitFor(1);
+        engine.setInputWidth(200);
+        engine.processStrokes();
+        engine.selectCandidate(1);
+        done.waitFor(4);
         const QStringList lines = log->take(core, QtDebugMsg);
-        QCOMPARE(lines.size(), 2);
-        QVERIFY(lines.at(0).startsWith(
-            text("void HmiCore::HmiHandwritingRecognizer::addStrokes(const QVariant&) Running from thread: QThread(")));
-        QVERIFY(
-            lines.at(1).startsWith(text("void HmiCore::HmiHandwritingRecognizer::triggerNewStrokePreProcessing(const "
-                                        "QVariant&) Running from thread: QThread(")));
+        const char* const expected[] = {"addStrokes(const QVariant&)", "triggerNewStrokePreProcessing(const QVariant&)",
+                                        "triggerRecognition()", "triggerProcessing()",
+                                        "triggerCandidateSelection(int)"};
+        QCOMPARE(lines.size(), 5);
+        for (int i = 0; i < 5; ++i)
+            QVERIFY2(lines.at(i).startsWith(QStringLiteral("void HmiCore::HmiHandwritingRecognizer::%1 Running from "
+                                                           "thread: QThread(")
+                                                .arg(QLatin1String(expected[i]))),
+                     qPrintable(lines.at(i)));
     }
 
     void qmlStrokesAreOpenedInItsThread()

@@ -60,7 +60,8 @@ void judge(Diagnosis* diagnosis, Effect effect, const char* code, const QString&
 QString foreignQt(const ElfFile& library)
 {
     static const QRegularExpression core(QStringLiteral("^libQt(\\d+)Core\\.so"));
-    for (const QString& name : library.libraries())
+    const QStringList libraries = library.libraries();
+    for (const QString& name : libraries)
         if (const auto match = core.match(name);
             match.hasMatch() && match.captured(1).toInt() != QLibraryInfo::version().majorVersion())
             return name;

@@ -17,8 +17,10 @@
 namespace {
 
 /// What Qt's own modules describe; everything else that a type derives from goes into its module's description.
-const QSet<QByteArray> describedByQt{"QObject", "QAbstractItemModel", "QAbstractListModel", "QQuickItem",
-                                     "QQuickPaintedItem"};
+QSet<QByteArray> describedByQt()
+{
+    return {"QObject", "QAbstractItemModel", "QAbstractListModel", "QQuickItem", "QQuickPaintedItem"};
+}
 
 #if QT_VERSION_MAJOR >= 6
 int majorVersion(const QQmlType& type)
@@ -214,7 +216,8 @@ bool writeFile(const QString& path, const QByteArray& content, QString* error)
 QList<RegisteredType> registeredTypes(const QStringList& modules)
 {
     QList<QQmlType> types;
-    for (const QQmlType& type : QQmlMetaType::qmlTypes()) {
+    const auto registered = QQmlMetaType::qmlTypes();
+    for (const QQmlType& type : registered) {
         if (modules.contains(QString(type.module())) && type.metaObject())
             types.append(type);
     }
@@ -231,7 +234,7 @@ QList<RegisteredType> registeredTypes(const QStringList& modules)
 
 QByteArray typeDescription(const QList<RegisteredType>& types)
 {
-    QSet<QByteArray> known = describedByQt;
+    QSet<QByteArray> known = describedByQt();
     for (const RegisteredType& type : types)
         known.insert(type.metaObject->className());
     Writer out;

@@ -54,7 +54,8 @@ bool registerEngines(const QDir& folder)
             continue;
         }
         const auto keys = loader.metaData().value(QLatin1String("MetaData")).toObject().value(QLatin1String("Keys"));
-        for (const QJsonValue& key : keys.toArray())
+        const QJsonArray names = keys.toArray();
+        for (const auto& key : names)
             some |= plugin->registerEngine(key.toString(), QCoreApplication::instance());
     }
     if (!some)

@@ -19,7 +19,8 @@ bool isComment(const QString& line)
 bool readWritten(const QStringList& fields, Recording& recording)
 {
     recording.meant = fields.constFirst();
-    for (const QString& points : fields.mid(1)) {
+    const QStringList strokes = fields.mid(1);
+    for (const QString& points : strokes) {
         const QVariant found = stroke(points);
         if (!found.isValid())
             return false;

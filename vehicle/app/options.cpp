@@ -137,7 +137,8 @@ void Options::takeCommands(const QStringList& words)
     if (words.constFirst() != QLatin1String("send")) {
         commands.push_back(words);
     } else {
-        for (const QString& text : words.mid(1)) {
+        const QStringList texts = words.mid(1);
+        for (const QString& text : texts) {
             QStringList split;
             const QString problem = Command::split(text, &split);
             if (!problem.isEmpty())

@@ -42,25 +42,25 @@ CallTable::CallTable()
 {
     const QJsonObject document = readResource(QStringLiteral(":/HmiVehicle/sources.json"));
     const QJsonArray records = document.value(QLatin1String("records")).toArray();
-    for (const QJsonValue record : records)
+    for (const auto& record : records)
         m_records.insert(nameOf(record), record.toObject().value(QLatin1String("fields")).toArray());
     const QJsonArray sources = document.value(QLatin1String("sources")).toArray();
-    for (const QJsonValue value : sources) {
+    for (const auto& value : sources) {
         const QJsonObject source = value.toObject();
         Entry entry = m_sources.value(source.value(QLatin1String("base")).toString());
         entry.isAbstract = source.value(QLatin1String("abstract")).toBool();
         const QJsonArray calls = source.value(QLatin1String("calls")).toArray();
-        for (const QJsonValue call : calls) {
+        for (const auto& call : calls) {
             entry.calls.insert(nameOf(call), call.toObject().value(QLatin1String("args")).toArray());
             entry.callNames.append(nameOf(call));
         }
         const QJsonArray state = source.value(QLatin1String("state")).toArray();
-        for (const QJsonValue field : state) {
+        for (const auto& field : state) {
             entry.state.insert(nameOf(field), field.toObject());
             entry.stateNames.append(nameOf(field));
         }
         const QJsonArray enums = source.value(QLatin1String("enums")).toArray();
-        for (const QJsonValue enumeration : enums)
+        for (const auto& enumeration : enums)
             entry.enums.insert(nameOf(enumeration), enumeration.toObject());
         m_sources.insert(nameOf(source), entry);
         if (!entry.isAbstract)
@@ -113,11 +113,11 @@ QString CallTable::checkRecords(const QJsonObject& description, const QJsonArray
     const QJsonArray fields = m_records.value(description.value(QLatin1String("record")).toString());
     if (records.size() > description.value(QLatin1String("max")).toInt(maximumList))
         return QStringLiteral("too many entries");
-    for (const QJsonValue value : records) {
+    for (const auto& value : records) {
         const QJsonObject record = value.toObject();
         if (record.size() != fields.size())
             return QStringLiteral("a record that has not all fields and no others");
-        for (const QJsonValue entry : fields) {
+        for (const auto& entry : fields) {
             const QString problem = checkValue(entry.toObject(), QJsonObject(), record.value(nameOf(entry)));
             if (!problem.isEmpty())
                 return nameOf(entry) + QStringLiteral(": ") + problem;

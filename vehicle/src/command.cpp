@@ -247,7 +247,7 @@ QString Command::wordsOf(const QJsonObject& line, QStringList* words)
         const QJsonValue value = name ? line.value(QLatin1String(name)) : QJsonValue(QJsonValue::Undefined);
         known.append(QLatin1String(name));
         const QJsonArray list = value.isArray() && grammar->parse == parseDo ? value.toArray() : QJsonArray{value};
-        for (const QJsonValue entry : list)
+        for (const auto& entry : list)
             if (!entry.isUndefined() && !value.isUndefined())
                 words->append(grammar->parse == parseSet ? wordFromValue(entry) : wordFromMember(entry));
     }

@@ -64,7 +64,7 @@ void ControlSession::take(const QByteArray& line)
     const QJsonValue id = object.value(QLatin1String("id"));
     QStringList words;
     bool allTexts = !list.isEmpty() && id.isDouble();
-    for (const QJsonValue word : list) {
+    for (const auto& word : list) {
         allTexts = allTexts && word.isString();
         words.append(word.toString());
     }

@@ -149,7 +149,7 @@ QString wordFromValue(const QJsonValue& value)
 QString callText(const QString& source, const QString& call, const QJsonArray& arguments)
 {
     QStringList words;
-    for (const QJsonValue argument : arguments)
+    for (const auto& argument : arguments)
         words.append(wordFromValue(argument));
     return QStringLiteral("%1.%2(%3)").arg(source, call, words.join(QStringLiteral(", ")));
 }

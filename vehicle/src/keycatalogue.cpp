@@ -35,7 +35,7 @@ KeyCatalogue::KeyCatalogue()
     const QJsonObject document = readResource(QStringLiteral(":/HmiVehicle/keys.json"));
     m_longPress = numberOf(document, "longPress");
     const QJsonArray keys = document.value(QLatin1String("keys")).toArray();
-    for (const QJsonValue value : keys) {
+    for (const auto& value : keys) {
         const QJsonObject key = value.toObject();
         const bool onWheel = textOf(key, "group") == QLatin1String("wheel");
         const bool isRotary = textOf(key, "kind") == QLatin1String("rotary");
@@ -45,7 +45,7 @@ KeyCatalogue::KeyCatalogue()
                        numberOf(key, "longPress", m_longPress), numberOf(key, "repeat")});
     }
     const QJsonArray combinations = document.value(QLatin1String("combinations")).toArray();
-    for (const QJsonValue value : combinations) {
+    for (const auto& value : combinations) {
         const QJsonObject object = value.toObject();
         KeyCombination combination{numberOf(object, "id"),
                                    textOf(object, "name"),
@@ -53,7 +53,7 @@ KeyCatalogue::KeyCatalogue()
                                    {},
                                    numberOf(object, "hold")};
         const QJsonArray names = object.value(QLatin1String("keys")).toArray();
-        for (const QJsonValue name : names)
+        for (const auto& name : names)
             combination.keys.append(idFrom(name.toString()));
         m_combinations.append(combination);
     }

@@ -96,7 +96,7 @@ BridgeTester::BridgeTester()
     resetState();
     divertCalls([](const QString& source, const QString& call, const QJsonArray& arguments) {
         QVariantList values;
-        for (const QJsonValue value : arguments)
+        for (const auto& value : arguments)
             values.append(plain(value));
         record().append({source, call, values});
     });
@@ -161,7 +161,8 @@ QList<BridgeTester::Call> BridgeTester::calls()
 QStringList BridgeTester::takeCalls()
 {
     QStringList texts;
-    for (const Call& call : std::exchange(record(), {}))
+    const auto calls = std::exchange(record(), {});
+    for (const Call& call : calls)
         texts.append(call.text());
     return texts;
 }

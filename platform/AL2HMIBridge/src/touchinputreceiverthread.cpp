@@ -10,20 +10,25 @@ namespace AL2HMIBridge {
 
 namespace {
 const QString wireName = QStringLiteral("TouchInput");
-QPointer<TouchInputReceiverThread> newest;
+
+QPointer<TouchInputReceiverThread>& newest()
+{
+    static QPointer<TouchInputReceiverThread> s_newest;
+    return s_newest;
 }
+} // namespace
 
 TouchInputReceiverThread::TouchInputReceiverThread(QObject* parent)
     : ReceiveThread(BridgeEndpoint::Touch, parent)
 {
-    newest = this;
+    newest() = this;
 }
 
 TouchInputReceiverThread::~TouchInputReceiverThread() = default;
 
 TouchInputReceiverThread* TouchInputReceiverThread::instance()
 {
-    return newest;
+    return newest();
 }
 
 void TouchInputReceiverThread::setPassThroughViewVisible(bool visible)

@@ -65,7 +65,7 @@ QString decodeIntList(const QJsonValue& json, const ValueShape& shape, Value* va
                            nullptr};
     QList<int> list;
     list.reserve(array.size());
-    for (const QJsonValue element : array) {
+    for (const auto& element : array) {
         Value number;
         const QString problem = decodeInt(element, entry, &number);
         if (!problem.isEmpty())
@@ -102,7 +102,7 @@ QString decodeRecords(const QJsonValue& json, const ValueShape& shape, Value* va
         return QStringLiteral("more than %1 entries").arg(shape.maximum);
     QVariantList list;
     list.reserve(array.size());
-    for (const QJsonValue entry : array) {
+    for (const auto& entry : array) {
         QVariantMap map;
         const QString problem =
             entry.isObject() ? decodeRecord(entry.toObject(), *shape.record, &map) : QStringLiteral("not an object");

@@ -43,9 +43,10 @@ ThemeDocument ThemeDocument::read(const QString& path)
                 return failure(where + QLatin1Char('.') + entry.key(), QStringLiteral("is not a colour"));
             colors.insert(entry.key(), color);
         }
+        const QStringList names = colors.keys();
         if (roles.isEmpty())
-            roles = colors.keys();
-        if (colors.isEmpty() || colors.keys() != roles)
+            roles = names;
+        if (colors.isEmpty() || names != roles)
             return failure(where, QStringLiteral("must give a colour to the same roles as the other palettes"));
         document.palettes.insert(palette.key(), colors);
     }
