@@ -92,8 +92,9 @@ class FileFaults(unittest.TestCase):
                 done = self.headunit(option, full, *extra)
                 self.assertIn("full.svg", done.stderr)
 
-    def test_missing_folder_is_told_with_the_file(self):
-        file = self.folder / "nowhere/file.svg"
+    def test_folder_that_is_none_is_told_with_the_file(self):
+        (self.folder / "occupied").touch()
+        file = self.folder / "occupied/file.svg"
         for option in ("--record", "--shot", "--startup-report"):
             with self.subTest(option=option):
                 done = self.headunit(option, file)
