@@ -108,7 +108,8 @@ bool ReceiveLoop::serve(FileDescriptor opened)
         const short events = short((reading ? POLLIN : 0) | (m_outbox.wantsToWrite() ? POLLOUT : 0));
         pollfd descriptors[] = {{m_outbox.waker().fd(), POLLIN, 0}, {m_outbox.socket(), events, 0}};
         wait(descriptors, events ? 2 : 1, reader.greeted() ? -1 : int(greeting.remainingTime()));
-        m_outbox.waker().clear();
+        if (descriptors[0].revents)
+            m_outbox.waker().clear();
         if (events & POLLOUT)
             m_outbox.flush();
         if (reading && descriptors[1].revents && !receive(descriptors[1].fd, reader))

@@ -72,7 +72,7 @@ bool write(const QString& name, const QByteArray& content, QString* error)
     QSaveFile file(name);
     if (file.open(QIODevice::WriteOnly) && file.write(content) == content.size() && file.commit())
         return true;
-    *error = StartupReport::tr("Cannot write '%1': %2").arg(name, file.errorString());
+    *error = QStringLiteral("Cannot write '%1': %2").arg(name, file.errorString());
     return false;
 }
 
