@@ -4,6 +4,7 @@
 #include <QCoreApplication>
 #include <QTest>
 
+#include <future>
 #include <vector>
 
 namespace {
@@ -42,8 +43,13 @@ private Q_SLOTS:
                 auto recognizer = std::make_unique<FakeRecognizer>();
                 threads += threadOf(*recognizer);
                 QVERIFY(threads.constLast());
-                if (i % 2 == 0)
+                if (i % 2 == 0) {
                     outliving.push_back(std::move(recognizer));
+                } else {
+                    const QPointer<FakeRecognizer> destroyed(recognizer.release());
+                    destroyed->deleteLater(); // its thread may still be about to leave the operation
+                    QTRY_VERIFY(!destroyed);
+                }
             }
         }
         for (const QPointer<QThread>& thread : std::as_const(threads))
@@ -66,20 +72,25 @@ private Q_SLOTS:
         auto work = std::make_shared<Work>();
         work->waits = true;
         std::unique_ptr<FakeRecognizer> recognizer;
+        std::promise<QThread*> ended;
         QTest::ignoreMessage(QtWarningMsg,
                              "An engine still works at the end of the application; its thread is left behind.");
         {
             QCoreApplication application(programArguments, programArgument);
             recognizer = std::make_unique<FakeRecognizer>(work);
+            QObject::connect(recognizer.get(), &FakeRecognizer::done,
+                             [&ended](const QString&, QThread* thread) { ended.set_value(thread); });
             recognizer->processStrokes();
             work->begun.acquire();
         }
         QCOMPARE(work->finished, 0);
 
-        QSemaphore ended;
-        QObject::connect(recognizer.get(), &FakeRecognizer::done, [&ended] { ended.release(); });
         work->mayEnd.release();
-        QVERIFY(ended.tryAcquire(1, 10000));
+        auto result = ended.get_future();
+        QVERIFY(result.wait_for(std::chrono::seconds(10)) == std::future_status::ready);
+        QThread* const leftBehind = result.get();
+        QVERIFY(leftBehind->wait(10000)); // it was told to end
+        delete leftBehind;
     }
 
     void nextApplicationWaitsForItsOwn()
