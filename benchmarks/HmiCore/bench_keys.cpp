@@ -11,6 +11,8 @@
 #include <atomic>
 #include <chrono>
 #include <cstdlib>
+#include <poll.h>
+#include <sys/eventfd.h>
 
 using namespace AL2HMIBridge;
 
@@ -77,19 +79,51 @@ void keyToCall(benchmark::State& state)
     while (GlobalSource::instance()->mainAudioSource() != 1)
         QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents);
     bridge.skipSent();
-    std::atomic<bool> done{false};
     std::thread peer([&] {
         char buffer[4096];
         for (auto _ : state) {
             sendKeyLine(bridge.priority());
             benchmark::DoNotOptimize(::recv(bridge.messages(), buffer, sizeof buffer, 0));
         }
-        done = true;
-        sendKeyLine(bridge.priority()); // wakes the event loop for the last time
+        QMetaObject::invokeMethod(QCoreApplication::instance(), &QCoreApplication::quit, Qt::QueuedConnection);
     });
-    while (!done)
-        QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents);
+    QCoreApplication::exec();
     peer.join();
+}
+
+/// The hops of a key without anything done in between: a socket, a thread that wakes another, a socket.
+void bareRelay(benchmark::State& state)
+{
+    int in[2];
+    int out[2];
+    const int woken = ::eventfd(0, EFD_CLOEXEC);
+    if (::socketpair(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0, in) != 0
+        || ::socketpair(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0, out) != 0 || woken < 0)
+        return state.SkipWithError("no sockets");
+    std::thread receiver([&] {
+        char buffer[256];
+        for (pollfd wait{in[1], POLLIN, 0}; ::poll(&wait, 1, -1) == 1 && ::recv(in[1], buffer, sizeof buffer, 0) > 0;)
+            if (::eventfd_write(woken, 1) != 0)
+                return;
+    });
+    std::atomic<bool> done{false};
+    std::thread handler([&] {
+        eventfd_t count = 0;
+        for (pollfd wait{woken, POLLIN, 0}; ::poll(&wait, 1, -1) == 1 && ::eventfd_read(woken, &count) == 0 && !done;)
+            sendKeyLine(out[1]);
+    });
+    char buffer[256];
+    for (auto _ : state) {
+        sendKeyLine(in[0]);
+        benchmark::DoNotOptimize(::recv(out[0], buffer, sizeof buffer, 0));
+    }
+    done = true;
+    sendKeyLine(in[0]);
+    handler.join();
+    ::shutdown(in[0], SHUT_RDWR);
+    receiver.join();
+    for (const int descriptor : {in[0], in[1], out[0], out[1], woken})
+        ::close(descriptor);
 }
 
 } // namespace
@@ -108,6 +142,7 @@ int main(int argc, char** argv)
     measureManually("switch", [&](benchmark::State& state) { emitKeys(state, &limit, 89, 0); });
     measureManually("decision", [&](benchmark::State& state) { emitKeys(state, keys, 89, 0); });
     measure("socket round trip", bareRoundTrip);
+    measure("relay", bareRelay);
     measure("key to call", keyToCall);
 
     Ratios ratios;
@@ -115,6 +150,7 @@ int main(int argc, char** argv)
     ratios.row("200 keys to platform calls / signal, switch and calls", "decision and call", "switch and call", 3);
     ratios.row("200 keys that lead to nothing / signal and switch", "decision", "switch");
     ratios.row("key on a socket to call on a socket / round trip", "key to call", "socket round trip", 2);
+    ratios.row("key on a socket to call on a socket / its hops, bare", "key to call", "relay");
     std::_Exit(0); // the bridge's threads are running
 }
 

@@ -2,9 +2,13 @@
 #include "bridgefixture.h"
 
 #include <AL2HMIBridge/FMTunerSource>
+#include <AL2HMIBridge/HMI2ALMessageSender>
 #include <AL2HMIBridge/KeySource>
 
 #include <QFile>
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QJsonObject>
 #include <QSignalSpy>
 
 #include <pwd.h>
@@ -59,6 +63,24 @@ private Q_SLOTS:
         QCOMPARE(
             touch.readLine(),
             QByteArray("{\"args\":[true,3,-4],\"call\":\"setMobileNavTouchParamsOffset\",\"source\":\"TouchInput\"}"));
+    }
+
+    void callsOfAnyNameAreOneLineOfJson()
+    {
+        m_bridge->startMessages();
+        PeerSocket messages = m_bridge->peer.accept("messages");
+        QVERIFY(messages.greet());
+        QTRY_VERIFY(BridgeConnection::instance()->channelConnected(BridgeEndpoint::Messages));
+        const QString source = QStringLiteral("A \"source\"\n");
+        for (const QString& call : {QString(), QStringLiteral("set_it"), QString::fromUtf8("größer"), source}) {
+            const QJsonArray arguments{source, QJsonValue(), 0.5};
+            QVERIFY(HMI2ALMessageSender::instance()->send(source, call, arguments));
+            const QJsonObject expected{{QStringLiteral("source"), source},
+                                       {QStringLiteral("call"), call},
+                                       {QStringLiteral("args"), arguments}};
+            const QByteArray line = messages.readLine();
+            QCOMPARE(line, QJsonDocument(expected).toJson(QJsonDocument::Compact));
+        }
     }
 
     void createInstanceGivesTheOneThreadThatLives()
