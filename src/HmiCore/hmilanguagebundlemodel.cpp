@@ -1,8 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "hmilanguagebundlemodel.h"
 
-#include "hmilanguagepackcollection.h"
-
 #include <AL2HMIBridge/GlobalSource>
 #include <AL2HMIBridge/LanguageModel>
 
@@ -67,6 +65,7 @@ void HmiLanguageBundleModel::setBundleId(QString bundleId)
     if (bundleId == m_bundleId)
         return;
     m_bundleId = bundleId;
+    m_ordering = packs->policyForBundle(bundleId);
     Q_EMIT bundleIdChanged(bundleId);
     invalidate();
     Q_EMIT countChanged(count());
@@ -100,12 +99,13 @@ bool HmiLanguageBundleModel::filterAcceptsRow(int sourceRow, const QModelIndex&)
 
 bool HmiLanguageBundleModel::lessThan(const QModelIndex& left, const QModelIndex& right) const
 {
-    const HmiLanguagePackCollection* const packs = HmiLanguagePackCollection::instance();
-    switch (packs->policyForBundle(m_bundleId)) {
+    switch (m_ordering) {
     case HmiLanguagePackCollection::NameOrder:
         return left.data(nameRole).toString().compare(right.data(nameRole).toString(), Qt::CaseInsensitive) < 0;
-    case HmiLanguagePackCollection::DefinitionOrder:
+    case HmiLanguagePackCollection::DefinitionOrder: {
+        const HmiLanguagePackCollection* const packs = HmiLanguagePackCollection::instance();
         return packs->indexInBundle(m_bundleId, localeOf(left)) < packs->indexInBundle(m_bundleId, localeOf(right));
+    }
     case HmiLanguagePackCollection::InvalidOrder:
         return QSortFilterProxyModel::lessThan(left, right);
     }

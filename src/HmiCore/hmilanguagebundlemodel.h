@@ -2,6 +2,7 @@
 #pragma once
 
 #include "hmicore_export.h"
+#include "hmilanguagepackcollection.h"
 
 #include <QSortFilterProxyModel>
 #include <QString>
@@ -51,6 +52,7 @@ Q_SIGNALS:
 
 private:
     QString m_bundleId;
+    HmiLanguagePackCollection::OrderingPolicy m_ordering = HmiLanguagePackCollection::InvalidOrder; ///< of the bundle
     int m_candidateLanguage = -1;
     int m_supportedLanguage = -1;
 };

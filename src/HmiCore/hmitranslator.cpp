@@ -1,7 +1,22 @@
 // SPDX-License-Identifier: MIT
 #include "hmitranslator.h"
 
+#include <cstring>
+
 namespace HmiCore {
+
+namespace {
+
+constexpr char16_t carriageReturn = u'\r';
+
+/// Nearly no text has one, and each look-up asks: the first search, for the byte, costs less than half of the second.
+bool hasCarriageReturn(const QString& text)
+{
+    return std::memchr(text.constData(), carriageReturn, size_t(text.size()) * sizeof(QChar))
+           && text.contains(QChar(carriageReturn));
+}
+
+} // namespace
 
 HmiTranslator::HmiTranslator(QObject* parent)
     : QTranslator(parent)
@@ -15,8 +30,8 @@ QString HmiTranslator::translate(const char* context, const char* sourceText, co
     QString text = QTranslator::translate(context, sourceText, disambiguation, n);
     if (text.isEmpty())
         text = QString::fromLatin1(sourceText);
-    if (text.contains(QLatin1Char('\r'))) // removing copies, also when there is nothing to remove
-        text.remove(QLatin1Char('\r'));
+    if (hasCarriageReturn(text)) // removing copies, also when there is nothing to remove
+        text.remove(QChar(carriageReturn));
     return text;
 }
 

@@ -88,6 +88,18 @@ private Q_SLOTS:
         log.reset();
     }
 
+    void lettersWithTheByteOfACarriageReturnStay()
+    {
+        const QString word = QString::fromUtf8("več അ"); // U+010D and U+0D05
+        lay("a.qm", "Radio", word);
+        HmiTranslator translator(nullptr);
+        QVERIFY(translator.load(files->path(text("a.qm"))));
+        QCOMPARE(translator.translate("C", "Radio"), word);
+        lay("b.qm", "Radio", word + QLatin1Char('\r'));
+        QVERIFY(translator.load(files->path(text("b.qm"))));
+        QCOMPARE(translator.translate("C", "Radio"), word);
+    }
+
     void aTranslatorAlwaysAnswers()
     {
         lay("a.qm", "Radio", text("Rund\r\nfunk\r"));
@@ -96,6 +108,7 @@ private Q_SLOTS:
         QCOMPARE(translator.translate("C", "Radio"), text("Rund\nfunk"));
         QCOMPARE(translator.translate("C", "Ph\xf6ne\r"), QString::fromLatin1("Ph\xf6ne"));
         QCOMPARE(translator.translate("Other", "Radio"), text("Radio"));
+        QCOMPARE(translator.translate("C", "\r\r"), QString());
         QCOMPARE(translator.translate("C", ""), QString());
         QCOMPARE(translator.translate("C", "%n file(s)", nullptr, 2), text("%n Dateien"));
     }
