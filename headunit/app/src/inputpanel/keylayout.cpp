@@ -1,12 +1,12 @@
 // SPDX-License-Identifier: MIT
 #include "keylayout.h"
 
+#include "datafile.h"
+
 #include <HmiCore/HmiComplexKeyboard>
 #include <HmiCore/HmiHandwriting>
 
-#include <QFile>
 #include <QJsonArray>
-#include <QJsonDocument>
 #include <QJsonObject>
 #include <QMetaEnum>
 
@@ -63,19 +63,7 @@ public:
     {
     }
 
-    QJsonObject open()
-    {
-        QFile file(m_file);
-        if (!file.open(QIODevice::ReadOnly)) {
-            fail(QString(), file.errorString());
-            return {};
-        }
-        QJsonParseError parsing{};
-        const QJsonDocument document = QJsonDocument::fromJson(file.readAll(), &parsing);
-        if (!document.isObject())
-            fail(QString(), parsing.error ? parsing.errorString() : QStringLiteral("is no object"));
-        return document.object();
-    }
+    QJsonObject open() { return DataFile::read(m_file, &m_error); }
 
     QString text(const QJsonObject& object, const QString& field)
     {

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "town.h"
 
-#include <QFile>
+#include "datafile.h"
+
 #include <QHash>
 #include <QJsonArray>
-#include <QJsonDocument>
 #include <QJsonObject>
 
 #include <cmath>
@@ -102,20 +102,12 @@ private:
 
 std::shared_ptr<const Town> Town::load(const QString& fileName, QString* error)
 {
-    QFile file(fileName);
-    if (!file.open(QIODevice::ReadOnly)) {
-        *error = QStringLiteral("%1: %2").arg(fileName, file.errorString());
+    const QJsonObject object = DataFile::read(fileName, error);
+    if (!error->isEmpty())
         return nullptr;
-    }
-    QJsonParseError parseError;
-    const QJsonDocument document = QJsonDocument::fromJson(file.readAll(), &parseError);
-    if (parseError.error != QJsonParseError::NoError) {
-        *error = QStringLiteral("%1: %2 at byte %3").arg(fileName, parseError.errorString()).arg(parseError.offset);
-        return nullptr;
-    }
     TownReader reader;
     const auto town = std::make_shared<Town>();
-    reader.read(document.object(), town.get());
+    reader.read(object, town.get());
     if (reader.error.isEmpty())
         return town;
     *error = QStringLiteral("%1: %2").arg(fileName, reader.error);
