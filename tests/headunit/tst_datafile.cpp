@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
 #include "datafile.h"
+#include "scratchfile.h"
 
 #include <QFile>
 #include <QJsonArray>
-#include <QTemporaryDir>
 #include <QTest>
 
 #include <sys/stat.h>
@@ -12,16 +12,7 @@ class DataFileTest : public QObject
 {
     Q_OBJECT
 
-    QTemporaryDir m_folder;
-
-    QString write(const QByteArray& content)
-    {
-        const QString name = m_folder.filePath(QStringLiteral("data.json"));
-        QFile file(name);
-        const bool written =
-            file.open(QIODevice::WriteOnly | QIODevice::Truncate) && file.write(content) == content.size();
-        return written ? name : QString();
-    }
+    const ScratchFile m_file{QStringLiteral("data.json")};
 
     static QString complaint(const QString& file)
     {
@@ -34,10 +25,10 @@ private Q_SLOTS:
     void anObjectIsReadAsItIs()
     {
         QString error = QStringLiteral("of before");
-        const QJsonObject object = DataFile::read(write("{\"a\": [1]}"), &error);
+        const QJsonObject object = DataFile::read(m_file.with("{\"a\": [1]}"), &error);
         QCOMPARE(error, QString());
         QCOMPARE(object.value(QLatin1String("a")).toArray().at(0).toInt(), 1);
-        QCOMPARE(DataFile::read(write("{}"), &error), QJsonObject());
+        QCOMPARE(DataFile::read(m_file.with("{}"), &error), QJsonObject());
         QCOMPARE(error, QString());
     }
 
@@ -56,7 +47,7 @@ private Q_SLOTS:
     {
         QFETCH(QByteArray, content);
         QFETCH(QString, problem);
-        const QString file = write(content);
+        const QString file = m_file.with(content);
         const QString said = complaint(file);
         QVERIFY2(said.startsWith(file + QStringLiteral(": ")) && said.endsWith(problem), qPrintable(said));
     }
@@ -64,22 +55,22 @@ private Q_SLOTS:
     void theLargestIsRead()
     {
         QString error;
-        DataFile::read(write(QByteArray("{}").leftJustified(int(DataFile::maximumSize), ' ')), &error);
+        DataFile::read(m_file.with(QByteArray("{}").leftJustified(int(DataFile::maximumSize), ' ')), &error);
         QCOMPARE(error, QString());
     }
 
     void whatCannotEndIsNotOpened()
     {
-        const QString pipe = m_folder.filePath(QStringLiteral("pipe"));
+        const QString pipe = m_file.folder() + QStringLiteral("/pipe");
         QCOMPARE(::mkfifo(QFile::encodeName(pipe).constData(), S_IRUSR | S_IWUSR), 0);
         QCOMPARE(complaint(pipe), pipe + QStringLiteral(": is no regular file"));
         QCOMPARE(complaint(QStringLiteral("/dev/zero")), QStringLiteral("/dev/zero: is no regular file"));
-        QCOMPARE(complaint(m_folder.path()), m_folder.path() + QStringLiteral(": is no regular file"));
+        QCOMPARE(complaint(m_file.folder()), m_file.folder() + QStringLiteral(": is no regular file"));
     }
 
     void aMissingFileIsNamed()
     {
-        const QString file = m_folder.filePath(QStringLiteral("nowhere"));
+        const QString file = m_file.folder() + QStringLiteral("/nowhere");
         QVERIFY(complaint(file).startsWith(file + QStringLiteral(": ")));
     }
 };

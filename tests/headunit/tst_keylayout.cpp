@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "keylayout.h"
+#include "scratchfile.h"
 
 #include <QDir>
-#include <QTemporaryDir>
 #include <QTest>
 
 /// Layout files, good and bad.
@@ -10,15 +10,9 @@ class KeyLayoutTest : public QObject
 {
     Q_OBJECT
 
-    static QString text(const char* utf8) { return QString::fromUtf8(utf8); }
+    const ScratchFile m_file{QStringLiteral("layout.json")};
 
-    QString write(const QByteArray& content) const
-    {
-        QFile file(m_folder.filePath(text("layout.json")));
-        if (file.open(QIODevice::WriteOnly))
-            file.write(content);
-        return file.fileName();
-    }
+    static QString text(const char* utf8) { return QString::fromUtf8(utf8); }
 
     static QStringList named(const QVariantList& row, const char* field)
     {
@@ -27,8 +21,6 @@ class KeyLayoutTest : public QObject
             names.append(key.toMap().value(text(field)).toString());
         return names;
     }
-
-    const QTemporaryDir m_folder;
 
 private Q_SLOTS:
     void allOfTheProductCanBeRead()
@@ -45,7 +37,7 @@ private Q_SLOTS:
     void rowsHaveKeysThatTypeAndKeysThatAct()
     {
         QString error;
-        const auto layout = KeyLayout::read(write(R"({"name": "L", "title": "abc", "handwriting": "Latin",
+        const auto layout = KeyLayout::read(m_file.with(R"({"name": "L", "title": "abc", "handwriting": "Latin",
             "rows": [{"before": ["shift", "layout"], "keys": "a ß space", "after": ["enter"]}],
             "more": {"a": "à á"}})"),
                                             &error);
@@ -63,7 +55,7 @@ private Q_SLOTS:
     void mirroredOnlyWhatActsChangesSides()
     {
         QString error;
-        const auto layout = KeyLayout::read(write(R"({"name": "L", "title": "abc",
+        const auto layout = KeyLayout::read(m_file.with(R"({"name": "L", "title": "abc",
             "rows": [{"before": ["shift", "layout"], "keys": "a b", "after": ["hide", "enter"]}]})"),
                                             &error);
         QVERIFY2(layout, qPrintable(error));
@@ -98,7 +90,7 @@ private Q_SLOTS:
     {
         QFETCH(QByteArray, content);
         QFETCH(QString, complaint);
-        const QString file = write(content);
+        const QString file = m_file.with(content);
         QString error;
         QVERIFY(!KeyLayout::read(file, &error));
         QVERIFY2(error.startsWith(file + text(": ")) && error.contains(complaint), qPrintable(error));

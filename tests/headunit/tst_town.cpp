@@ -1,24 +1,14 @@
 // SPDX-License-Identifier: MIT
+#include "scratchfile.h"
 #include "town.h"
 
-#include <QFile>
-#include <QTemporaryDir>
 #include <QTest>
 
 class TownTest : public QObject
 {
     Q_OBJECT
 
-    QTemporaryDir m_folder;
-
-    QString write(const QByteArray& content)
-    {
-        const QString name = m_folder.filePath(QStringLiteral("town.json"));
-        QFile file(name);
-        const bool written =
-            file.open(QIODevice::WriteOnly | QIODevice::Truncate) && file.write(content) == content.size();
-        return written ? name : QString();
-    }
+    const ScratchFile m_file{QStringLiteral("town.json")};
 
 private Q_SLOTS:
     void theTownOfTheHeadUnitIsWhole()
@@ -36,7 +26,7 @@ private Q_SLOTS:
     void whatIsReadIsWhatIsWritten()
     {
         QString error;
-        const auto town = Town::load(write(R"({"name": "Town", "start": {"at": [1, 2], "heading": 90},
+        const auto town = Town::load(m_file.with(R"({"name": "Town", "start": {"at": [1, 2], "heading": 90},
             "areas": [{"kind": "park", "name": "Park", "points": [[0, 0], [1, 0], [1, 1]]}],
             "streets": [{"name": "A", "class": "main", "points": [[0, 0], [10, 0], [10, 5]]}],
             "places": [{"name": "P", "category": "fuel", "at": [3, 4]}]})"),
@@ -86,14 +76,14 @@ private Q_SLOTS:
         QFETCH(QByteArray, content);
         QFETCH(QString, message);
         QString error;
-        QVERIFY(!Town::load(write(content), &error));
+        QVERIFY(!Town::load(m_file.with(content), &error));
         QVERIFY2(error.contains(message) && error.contains(QLatin1String("town.json")), qPrintable(error));
     }
 
     void aFileThatIsNotThereIsNamed()
     {
         QString error;
-        QVERIFY(!Town::load(m_folder.filePath(QStringLiteral("none.json")), &error));
+        QVERIFY(!Town::load(m_file.folder() + QStringLiteral("/none.json"), &error));
         QVERIFY2(error.contains(QLatin1String("none.json")), qPrintable(error));
     }
 };
