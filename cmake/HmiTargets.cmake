@@ -91,12 +91,15 @@ function(hmi_add_test name)
     endif()
     if(CMAKE_CROSSCOMPILING_EMULATOR)
         math(EXPR ARG_TIMEOUT "10 * ${ARG_TIMEOUT}")
+    elseif(ECM_ENABLE_SANITIZERS)
+        math(EXPR ARG_TIMEOUT "3 * ${ARG_TIMEOUT}")
     endif()
     add_executable(${name} ${ARG_SOURCES})
     target_link_libraries(${name} PRIVATE HmiTestSupport Qt${QT_VERSION_MAJOR}::Test ${ARG_LINK})
     hmi_watch_threads(${name})
     add_test(NAME ${name} COMMAND ${ARG_WRAPPER} ${CMAKE_CROSSCOMPILING_EMULATOR} $<TARGET_FILE:${name}>)
-    set_tests_properties(${name} PROPERTIES TIMEOUT ${ARG_TIMEOUT}
+    # The longest are started first, so that no single one is waited for at the end.
+    set_tests_properties(${name} PROPERTIES TIMEOUT ${ARG_TIMEOUT} COST ${ARG_TIMEOUT}
         ENVIRONMENT "QT_QPA_PLATFORM=offscreen;QT_QUICK_BACKEND=software;LC_ALL=C.UTF-8;${HMI_TEST_ENVIRONMENT};${ARG_ENVIRONMENT}")
 endfunction()
 
