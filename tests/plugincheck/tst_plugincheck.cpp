@@ -40,7 +40,10 @@ Outcome check(const QStringList& arguments)
 {
     QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
     // A sanitizer must leave signals as they are and take no leak for a fault of the plugin.
-    environment.insert(QStringLiteral("ASAN_OPTIONS"), QStringLiteral("handle_segv=0:handle_abort=0:detect_leaks=0"));
+    const QString signalsAsTheyAre = QStringLiteral(":handle_segv=0:handle_sigbus=0:handle_abort=0");
+    environment.insert(QStringLiteral("ASAN_OPTIONS"), QStringLiteral("detect_leaks=0") + signalsAsTheyAre);
+    const QString tsanOptions = QStringLiteral("TSAN_OPTIONS");
+    environment.insert(tsanOptions, environment.value(tsanOptions) + signalsAsTheyAre);
     QProcess process;
     process.setProcessEnvironment(environment);
     process.start(QStringLiteral(HMI_PLUGIN_CHECK), arguments);
