@@ -98,9 +98,10 @@ function(hmi_add_test name)
     target_link_libraries(${name} PRIVATE HmiTestSupport Qt${QT_VERSION_MAJOR}::Test ${ARG_LINK})
     hmi_watch_threads(${name})
     add_test(NAME ${name} COMMAND ${ARG_WRAPPER} ${CMAKE_CROSSCOMPILING_EMULATOR} $<TARGET_FILE:${name}>)
+    math(EXPR milliseconds "1000 * ${ARG_TIMEOUT}")
     # The longest are started first, so that no single one is waited for at the end.
     set_tests_properties(${name} PROPERTIES TIMEOUT ${ARG_TIMEOUT} COST ${ARG_TIMEOUT}
-        ENVIRONMENT "QT_QPA_PLATFORM=offscreen;QT_QUICK_BACKEND=software;LC_ALL=C.UTF-8;${HMI_TEST_ENVIRONMENT};${ARG_ENVIRONMENT}")
+        ENVIRONMENT "QT_QPA_PLATFORM=offscreen;QT_QUICK_BACKEND=software;LC_ALL=C.UTF-8;QTEST_FUNCTION_TIMEOUT=${milliseconds};${HMI_TEST_ENVIRONMENT};${ARG_ENVIRONMENT}")
 endfunction()
 
 # hmi_watch_threads(<executable>): lets the thread sanitizer, if there is one, see what Qt orders between threads. Every

@@ -117,6 +117,22 @@ private Q_SLOTS:
         QVERIFY(lines.contains("\"snapshot\":\"complete\""));
     }
 
+    void aRecordingIsWholeWhenTheHeadUnitIsEnded()
+    {
+        const QString recording = m_folder.filePath(QStringLiteral("ended.jsonl"));
+        QProcess process;
+        process.start(QCoreApplication::applicationDirPath() + QStringLiteral("/headunit"),
+                      {QStringLiteral("--record"), recording});
+        QTRY_VERIFY_WITH_TIMEOUT(QFile(recording).size() > 0, 60000);
+        process.terminate();
+        QVERIFY(process.waitForFinished(60000));
+        QCOMPARE(process.exitStatus(), QProcess::NormalExit);
+        QCOMPARE(process.exitCode(), 0);
+        QFile file(recording);
+        QVERIFY(file.open(QIODevice::ReadOnly));
+        QVERIFY(file.readAll().endsWith("}\n"));
+    }
+
     void mistakesEndWithAMessageAndTheirExitCode_data()
     {
         QTest::addColumn<QStringList>("arguments");

@@ -8,32 +8,18 @@
 #include "server.h"
 
 #include <HmiVehicle/controlpanel.h>
+#include <HmiVehicle/endsignals.h>
 
 #include <QGuiApplication>
-#include <QSocketNotifier>
 #include <QTextStream>
 #include <QTime>
 
 #include <algorithm>
-#include <csignal>
 #include <memory>
-#include <sys/signalfd.h>
-#include <unistd.h>
 
 using HmiVehicle::ControlPanel;
 
 namespace {
-
-/// Ends the event loop on SIGINT and SIGTERM, so that the sockets are removed.
-int openEndSignals()
-{
-    sigset_t signalsToEnd;
-    sigemptyset(&signalsToEnd);
-    sigaddset(&signalsToEnd, SIGINT);
-    sigaddset(&signalsToEnd, SIGTERM);
-    sigprocmask(SIG_BLOCK, &signalsToEnd, nullptr);
-    return ::signalfd(-1, &signalsToEnd, SFD_CLOEXEC | SFD_NONBLOCK);
-}
 
 int serve(const Options& options)
 {
@@ -124,7 +110,7 @@ int main(int argc, char** argv)
         QTextStream(stderr) << "vehicle-sim: " << options.message << '\n';
         return wrongUsage;
     }
-    QSocketNotifier endSignal(openEndSignals(), QSocketNotifier::Read);
-    QObject::connect(&endSignal, &QSocketNotifier::activated, application.get(), &QCoreApplication::quit);
+    HmiVehicle::EndSignals endSignals; // so that the sockets are removed
+    endSignals.quitEventLoop();
     return run(options);
 }

@@ -20,6 +20,7 @@
 #include <HmiLogging/MessageHandler>
 #include <HmiStateMachine/StateMachine>
 #include <HmiVehicle/embeddedvehicle.h>
+#include <HmiVehicle/endsignals.h>
 
 #include <QTextStream>
 
@@ -190,6 +191,9 @@ int main(int argc, char** argv)
     else
         BridgeEndpoint::setDirectory(commandLine.vehicleDirectory);
 
+    std::optional<HmiVehicle::EndSignals> endSignals; // a recording is whole when they end it
+    if (!commandLine.recordFile.isEmpty())
+        endSignals.emplace();
     BridgeRecorder recorder; // before the application object, whose construction starts the traffic
     if (!commandLine.recordFile.isEmpty() && !recorder.start(commandLine.recordFile)) {
         QTextStream(stderr) << "headunit: " << recorder.errorString() << '\n';
@@ -197,6 +201,8 @@ int main(int argc, char** argv)
     }
 
     HmiApplication application(argc, argv);
+    if (endSignals)
+        endSignals->quitEventLoop();
     applySettings(commandLine.size);
     AppSettings::instance()->setAnimations(!headless && !report);
     return run(application, commandLine, report ? &*report : nullptr);
